@@ -18,6 +18,12 @@ namespace ZarnMath {
     return static_cast<std::int32_t>(static_cast<std::uint32_t>(a) - static_cast<std::uint32_t>(b));
 }
 
+/// a * b modulo 2^32.
+[[nodiscard]] constexpr std::int32_t WrappingMultiply(std::int32_t a, std::int32_t b) noexcept
+{
+    return static_cast<std::int32_t>(static_cast<std::uint32_t>(a) * static_cast<std::uint32_t>(b));
+}
+
 /// a - b in double.
 [[nodiscard]] constexpr vector2d Difference(const point2d& a, const point2d& b) noexcept
 {

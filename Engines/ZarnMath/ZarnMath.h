@@ -4,4 +4,7 @@
 
 #include "ZarnMath/Bezier.h"
 #include "ZarnMath/BezierToLines.h"
+#include "ZarnMath/Bounds.h"
+#include "ZarnMath/FitLine.h"
+#include "ZarnMath/Line.h"
 #include "ZarnMath/ValueTypes.h"

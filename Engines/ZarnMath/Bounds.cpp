@@ -1,0 +1,220 @@
+#include "ZarnMath/Bounds.h"
+
+#include "ZarnMath/ValueTypesInternal.h"
+
+#include <algorithm>
+#include <utility>
+
+namespace ZarnMath {
+
+namespace {
+
+constexpr std::int32_t smallestInt = std::numeric_limits<std::int32_t>::min();
+constexpr std::int32_t largestInt = std::numeric_limits<std::int32_t>::max();
+
+constexpr RECT emptyRect{largestInt, smallestInt, smallestInt, largestInt};
+constexpr BoundsT<double> emptyBounds{largestInt, smallestInt, smallestInt, largestInt};
+
+/// Strict comparisons: a NaN widens nothing.
+template <typename Box, typename P>
+void Widen(Box& box, const P& p) noexcept
+{
+    if (p.x > box.right)
+        box.right = p.x;
+    if (p.y > box.top)
+        box.top = p.y;
+    if (p.x < box.left)
+        box.left = p.x;
+    if (p.y < box.bottom)
+        box.bottom = p.y;
+}
+
+/// Seeded by the first point, not by the empty box, so that it is right beyond the integer limits too.
+template <typename Box, typename P>
+Box BoxOf(const P* points, int count, const Box& empty) noexcept
+{
+    if (points == nullptr || count < 1)
+        return empty;
+    Box box{points[0].x, points[0].y, points[0].x, points[0].y};
+    for (int i = 1; i < count; ++i)
+        Widen(box, points[i]);
+    return box;
+}
+
+bool IsStrictlyNonEmpty(const RECT& rect) noexcept
+{
+    return rect.left < rect.right && rect.bottom < rect.top;
+}
+
+template <typename Box, typename P>
+void StoreCorners(const Box& box, P* out) noexcept
+{
+    out[0] = {box.left, box.top};
+    out[1] = {box.right, box.top};
+    out[2] = {box.right, box.bottom};
+    out[3] = {box.left, box.bottom};
+}
+
+template <typename P>
+bool Contains(const RECT& rect, const P& p) noexcept
+{
+    if (!(rect.left <= p.x && p.x <= rect.right))
+        return false;
+    return (rect.bottom <= p.y && p.y <= rect.top) || (rect.top <= p.y && p.y <= rect.bottom);
+}
+
+} // namespace
+
+RECT GetEmptyRect() noexcept
+{
+    return emptyRect;
+}
+
+void InitializeEmpty(RECT& box) noexcept
+{
+    box = emptyRect;
+}
+
+void InitializeEmpty(BoundsT<double>& box) noexcept
+{
+    box = emptyBounds;
+}
+
+void NormalizeRect(RECT& rect) noexcept
+{
+    if (rect.right < rect.left)
+        std::swap(rect.left, rect.right);
+    if (rect.top < rect.bottom)
+        std::swap(rect.top, rect.bottom);
+}
+
+RECT GetPointsBBox(const POINT* points, int count) noexcept
+{
+    return BoxOf(points, count, emptyRect);
+}
+
+BoundsT<double> GetPointsBBox(const point2d* points, int count) noexcept
+{
+    return BoxOf(points, count, emptyBounds);
+}
+
+void GetPointsBBox(const POINT* points, int count, RECT& out) noexcept
+{
+    out = BoxOf(points, count, emptyRect);
+}
+
+void UnionPointWithRect(RECT& rect, const POINT& p) noexcept
+{
+    Widen(rect, p);
+}
+
+void UnionPointWithRect(RECT& rect, const point2d& p) noexcept
+{
+    if (p.x > rect.right)
+        rect.right = RoundToInt(std::ceil(p.x));
+    if (p.y > rect.top)
+        rect.top = RoundToInt(std::ceil(p.y));
+    if (p.x < rect.left)
+        rect.left = RoundToInt(std::floor(p.x));
+    if (p.y < rect.bottom)
+        rect.bottom = RoundToInt(std::floor(p.y));
+}
+
+void UnionPointsWithRect(RECT& rect, const POINT* points, int count) noexcept
+{
+    for (int i = 0; i < count; ++i)
+        Widen(rect, points[i]);
+}
+
+bool UnionRect(RECT& a, const RECT& b) noexcept
+{
+    if (!IsStrictlyNonEmpty(a))
+        a = b;
+    else if (IsStrictlyNonEmpty(b))
+        a = {std::min(a.left, b.left), std::max(a.top, b.top), std::max(a.right, b.right),
+             std::min(a.bottom, b.bottom)};
+    return IsStrictlyNonEmpty(a);
+}
+
+bool IntersectRect(RECT& a, const RECT& b) noexcept
+{
+    if (b.top < b.bottom || a.top < a.bottom)
+        return false;
+    a = {std::max(a.left, b.left), std::min(a.top, b.top), std::min(a.right, b.right), std::max(a.bottom, b.bottom)};
+    return IsStrictlyNonEmpty(a);
+}
+
+void TranslateRect(RECT& rect, int dx, int dy) noexcept
+{
+    rect = {WrappingAdd(rect.left, dx), WrappingAdd(rect.top, dy), WrappingAdd(rect.right, dx),
+            WrappingAdd(rect.bottom, dy)};
+}
+
+void TranslateValidRect(RECT& rect, int dx, int dy) noexcept
+{
+    if (rect.left <= rect.right && rect.bottom <= rect.top)
+        TranslateRect(rect, dx, dy);
+}
+
+void InflateRect(RECT& rect, int dx, int dy) noexcept
+{
+    rect = {WrappingSubtract(rect.left, dx), WrappingAdd(rect.top, dy), WrappingAdd(rect.right, dx),
+            WrappingSubtract(rect.bottom, dy)};
+}
+
+void GetRectCorners(const BoundsT<double>& box, point2d* out) noexcept
+{
+    StoreCorners(box, out);
+}
+
+void GetRectCorners(const RECT& box, POINT* out) noexcept
+{
+    StoreCorners(box, out);
+}
+
+POINT GetRectCenter(const RECT& rect) noexcept
+{
+    return {WrappingAdd(rect.left, rect.right) / 2, WrappingAdd(rect.top, rect.bottom) / 2};
+}
+
+double GetRectArea(const RECT& rect) noexcept
+{
+    const double height = WrappingSubtract(rect.top, rect.bottom);
+    const double width = WrappingSubtract(rect.right, rect.left);
+    return std::fabs(height * width);
+}
+
+bool IsPointInRect(const POINT& p, const RECT& rect) noexcept
+{
+    return Contains(rect, p);
+}
+
+bool IsPointInRect(const point2d& p, const RECT& rect) noexcept
+{
+    return Contains(rect, p);
+}
+
+bool IsAnyPointInRect(const POINT* points, unsigned long count, const RECT& rect) noexcept
+{
+    return std::any_of(points, points + count, [&rect](const POINT& p) { return Contains(rect, p); });
+}
+
+RECT GetPointRect(const POINT& p, int r) noexcept
+{
+    return GetPointRect(p, r, r);
+}
+
+RECT GetPointRect(const POINT& p, int rx, int ry) noexcept
+{
+    RECT rect{p.x, p.y, p.x, p.y};
+    InflateRect(rect, rx, ry);
+    return rect;
+}
+
+const BoundsT<double>& IdentityBounds() noexcept
+{
+    static const BoundsT<double> identity{0.0, 1.0, 1.0, 0.0};
+    return identity;
+}
+
+} // namespace ZarnMath
