@@ -12,7 +12,18 @@
 namespace ZarnMath::Vectors {
 
 /// The functions of the platform's mathematical library that are not rounded the same everywhere.
-enum class Platform { Sin, Cos, Tan, Atan, Atan2, Acos, Exp, Log, Pow };
+enum class Platform
+{
+    Sin,
+    Cos,
+    Tan,
+    Atan,
+    Atan2,
+    Acos,
+    Exp,
+    Log,
+    Pow
+};
 
 /// The name of the function in a file.
 std::string NameOf(Platform function);
