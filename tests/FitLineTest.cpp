@@ -102,6 +102,12 @@ TEST(FitLine, TwoPoints)
     EXPECT_NEAR(line.direction.x, 3.0, 1e-14);
 }
 
+TEST(FitLine, MixedMomentHasNoTolerance)
+{
+    const Line line = Fit({{0.0, 0.0}, {1e-9, 1e-9}, {2e-9, 2e-9}});
+    EXPECT_NEAR(line.direction.x, 1.0, 1e-12);
+}
+
 TEST(FitLine, FractionalHorizontalPointsGiveAHugeDirection)
 {
     const Line line = Fit({{0.0, 0.7}, {1.0, 0.7}, {3.0, 0.7}}); // the mixed moment rounds to 2^-51

@@ -61,6 +61,10 @@ TEST(From3Points, TinyBisectorIsNotNormalised)
     // the point itself, 1e9, and the control point comes to lie 1e-8*1e9 above it.
     EXPECT_EQ(Construct({0.0, 0.0}, {1e9, 5.0}, {2e9, 0.0}, false),
               (IntegerCubic{{{0, 0}, {666666667, 10}, {1333333333, 10}, {2000000000, 0}}}));
+    // Around x = 0 it does move the point: the distances are those from the horizontal through it, and so is the lift of
+    // the control point, 5e-8.
+    EXPECT_EQ(Construct({-1e9, 0.0}, {0.0, 5.0}, {1e9, 0.0}, false),
+              (IntegerCubic{{{-1000000000, 0}, {-333333333, 3}, {333333333, 3}, {1000000000, 0}}}));
 }
 
 TEST(From3Points, CoincidentEndsForceTheSimpleArc)

@@ -220,6 +220,14 @@ TEST(LengthOfPieces, NothingIsExactlyNothing)
     EXPECT_TRUE(SameBits(LengthFrom(1.0, unbounded.data()), 0.0));
 }
 
+TEST(LengthOfPieces, NearlyNothingIsMeasured)
+{
+    const Cubic line = {{{0.0, 0.0}, {1e20, 0.0}, {2e20, 0.0}, {3e20, 0.0}}};
+    EXPECT_NEAR(LengthTo(1e-17, line.data()), 3000.0, 0.01);
+    const Cubic back = {{{3e20, 0.0}, {2e20, 0.0}, {1e20, 0.0}, {0.0, 0.0}}};
+    EXPECT_GT(LengthFrom(Below(1.0), back.data()), 0.0);
+}
+
 TEST(LengthOfPieces, AreThoseOfTheCutPiecesAtOrderTen)
 {
     const Cubic curve = {{{1.0, 2.0}, {3.0, 7.0}, {8.0, -1.0}, {9.0, 4.0}}};
@@ -274,6 +282,11 @@ TEST(RelativeLength, FractionsBeyondTheEnds)
     EXPECT_EQ(OnUnitSegment(3.0, 0.1), 1.0);
     EXPECT_EQ(OnUnitSegment(infinity, 0.1), 1.0);
     EXPECT_EQ(OnUnitSegment(nan, 0.0), 0.5); // one pass, after which nothing is above the tolerance
+    const point2d undefined{nan, nan};
+    for (const double fraction : {0.0, 0.25, 1.0}) // the ends are decided before anything is measured
+        EXPECT_EQ(
+            GetCurveRelativeLengthParameter(fraction, undefined, undefined, undefined, 0.0, LengthAccuracy::Order8),
+            fraction == 0.25 ? 0.5 : fraction);
 }
 
 TEST(RelativeLength, FirstPassBisects)

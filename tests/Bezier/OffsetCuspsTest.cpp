@@ -246,6 +246,18 @@ TEST(OffsetCuspsProperties, SidesShareOutAllParameters)
     });
 }
 
+TEST(OffsetCuspsProperties, DistanceOfZeroKeepsNothingOfEitherSign)
+{
+    int zerosOfTheSpeed = 0;
+    ForManyCurves(5, 3000, [&](const Sample& s) {
+        zerosOfTheSpeed += static_cast<int>(CuspsOfBothSides(s.f, 0.0).size());
+        EXPECT_EQ(Cusps(s.f, 0.0), Parameters{});
+        EXPECT_EQ(Cusps(s.f, -0.0), Parameters{});
+    });
+    EXPECT_GT(zerosOfTheSpeed, 10);
+    RecordProperty("zerosOfTheSpeed", zerosOfTheSpeed);
+}
+
 TEST(OffsetCuspsProperties, NothingIsWrittenBehindTheCount)
 {
     ForManyCurves(4, 500, [](const Sample& s) {
