@@ -237,8 +237,8 @@ ZARNMATH_API int FindCurvatureMinMax(const point2d& a, const point2d& b, const p
 /// @}
 /// @name Length
 /// Arc length by one pass of Gauss-Legendre quadrature of the speed, without control of the error. The nodes and weights
-/// are kept short, so that lengths are good to about eight digits at best, and that of a straight unit segment is not
-/// exactly 1 at orders 5, 6 and 10. A curve with a sharp turn between samples is off by far more.
+/// are kept short, most of them at eight decimal places: at orders 5, 6 and 10 a straight unit segment is off by 1e-08
+/// already. A curve with a sharp turn between samples is off by far more.
 ///
 /// The squared speed is evaluated as a quartic: where it all but vanishes, rounding can take it below zero, and the length
 /// is then NaN.

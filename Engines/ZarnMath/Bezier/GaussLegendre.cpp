@@ -7,7 +7,7 @@ namespace {
 // The nodes and weights of Gauss-Legendre quadrature on [-1, 1], all orders one after the other, each from the most
 // negative node to the most positive one. They are deliberately short: the exact values rounded to 15 decimal places at
 // orders 2, 4 and 8, to 14 at order 16, and to 8 at the others, but for the weights of order 3, which are full doubles, and
-// the nodes +-0.23861918 of order 6, which are cut. Lengths show that at the level of 1e-08.
+// the nodes +-0.23861918 of order 6, which are cut. The short ones show in lengths at the level of 1e-08.
 
 // clang-format off
 constexpr double adAbscissae[61] = {
