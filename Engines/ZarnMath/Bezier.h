@@ -28,6 +28,22 @@ enum Side : std::int32_t
     SideNegative = 2, ///< to the right
 };
 
+/// How exactly a length is taken: the number of points at which the speed is sampled.
+///
+/// Any `int` can be cast to it: below 2 counts as 2, 9 as 10, and above 10 as 16.
+enum class LengthAccuracy : int
+{
+    Order2 = 2,
+    Order3 = 3,
+    Order4 = 4,
+    Order5 = 5,
+    Order6 = 6,
+    Order7 = 7,
+    Order8 = 8,
+    Order10 = 10,
+    Order16 = 16,
+};
+
 } // namespace ZarnMath
 
 namespace ZarnMath::CubicBezier {
@@ -113,6 +129,177 @@ ZARNMATH_API void RightOf(double t, const POINT* in, POINT* out) noexcept;
 /// @param[out] out four control points
 ZARNMATH_API void Subsection(double t0, double t1, const point2d* in, point2d* out) noexcept;
 ZARNMATH_API void Subsection(double t0, double t1, const POINT* in, POINT* out) noexcept;
+
+/// @}
+/// @name Construction
+/// Cubics through given points, rounded to whole units, as for a curve that is dragged by a point on it.
+/// @{
+
+/// A quadratic arc by three points, raised to a cubic.
+///
+/// Its control point Q is one of two:
+/// - *simple*: through + (through - (start + end)/2), so that the arc runs through `through` at t = 0.5;
+/// - otherwise on the outer bisector of the corner at `through`, as far from it as the geometric mean of the distances of
+///   start and end from the line through it that is square to the bisector. This makes a pleasant arc near `through`,
+///   and not in general through it. Where start, `through` and end follow each other on a straight line, so that there is
+///   no bisector, Q is `through` itself.
+///
+/// @param[out] out            four control points: the rounded start, start + 2/3*(Q - start), Q + 1/3*(end - Q) and end
+/// @param start, through, end the points, in curve order
+/// @param simple              asks for the simple arc, which is taken anyway where `through` or end coincides with start
+ZARNMATH_API void From3Points(POINT* out, const point2d& start, const point2d& through, const point2d& end,
+                              bool simple) noexcept;
+
+/// The cubic with given end tangents that runs through a point at t = 0.5.
+///
+/// Its inner control points are start + startTangent*alpha and end + endTangent*beta. A tangent gives a line, not a
+/// direction: alpha and beta may come out negative.
+///
+/// @param[out] out              four control points, rounded
+/// @param start, through, end   the points, in curve order
+/// @param startTangent          the line of the tangent at start, of any length
+/// @param endTangent            the line of the tangent at end, of any length
+/// @return false, with `out` untouched, where |Cross(startTangent, endTangent)| <= DBL_EPSILON: the tangents are parallel,
+///         or too short
+ZARNMATH_API bool From3Points(POINT* out, const point2d& start, const vector2d& startTangent, const point2d& through,
+                              const point2d& end, const vector2d& endTangent) noexcept;
+
+/// @}
+/// @name Curvature
+/// Curvature is signed: Cross(P', P'')/|P'|^3, positive where the curve turns to the left, that is counter-clockwise. Its
+/// radius, the reciprocal, has the same sign. Both are undefined at a cusp, where P' vanishes.
+///
+/// The `Safe` functions give a usable value at a cusp and at coincident control points too.
+/// @{
+
+/// The curvature at a parameter.
+///
+/// @param t              parameter
+/// @param a, b, c        power form
+/// @param[out] curvature in reciprocal drawing units
+/// @return false, with `curvature` untouched, where |P'(t)|^3 is not above 0. There is no tolerance, but the cube of a
+///         speed below about 1e-108 underflows to 0
+ZARNMATH_API bool GetCurvatureAt(double t, const point2d& a, const point2d& b, const point2d& c,
+                                 double& curvature) noexcept;
+
+/// The radius of curvature at a parameter.
+///
+/// @param t           parameter
+/// @param a, b, c     power form
+/// @param[out] radius in drawing units; the largest double where the curve is straight or has a cusp
+/// @return false where Cross(P', P'') is exactly 0
+ZARNMATH_API bool GetCurvatureRadiusAt(double t, const point2d& a, const point2d& b, const point2d& c,
+                                       double& radius) noexcept;
+
+/// The curvature at a parameter, or near it.
+///
+/// @param t       parameter
+/// @param a, b, c power form
+/// @return the curvature at t; where it is undefined, that at t + 1e-05 for t <= 0.5 and at t - 1e-05 beyond, toward the
+///         middle of the curve; and 0.0 where that is undefined too
+[[nodiscard]] ZARNMATH_API double SafeBezierCurvature(double t, const point2d& a, const point2d& b,
+                                                      const point2d& c) noexcept;
+
+/// The two parameters at which Cross(P', P'') vanishes, where the curvature changes sign.
+///
+/// Nothing is filtered: the values are not sorted, may lie outside [0, 1], and are equal for a double root. Where the
+/// quadratic has no quadratic term they are infinite or NaN.
+///
+/// @param a, b, c  power form
+/// @param[out] out two values
+/// @return 2; or 0, with `out` untouched, where the discriminant is negative
+ZARNMATH_API int BezierInflectionPoints(const point2d& a, const point2d& b, const point2d& c, double* out) noexcept;
+
+/// The parameters in (0, 1) at which the derivative of |P'|^6 vanishes, where the speed is extreme.
+///
+/// On a curve as it is commonly drawn these lie near its sharpest and its flattest points; curvature itself does not
+/// enter. A zero of the speed is a double root of that polynomial, of degree 11, and may be listed once, twice or not at
+/// all.
+///
+/// @param a, b, c  power form
+/// @param[out] out room for 11 values, of which the count is written, in the root finder's order
+/// @return the number of parameters
+ZARNMATH_API int FindCurvatureMinMax(const point2d& a, const point2d& b, const point2d& c, double* out) noexcept;
+
+/// The direction in which a cubic runs at a parameter.
+///
+/// The first of these that is long enough, its squared length at least DBL_EPSILON: the derivative; the chord over a step
+/// of 1e-05 toward the middle of the curve; and, whatever its length, the chord from 1e-06 to 0.999999. At the start of a
+/// curve with P1 = P0, the second step serves only control polygons of about 50 units or more; below that it is the
+/// direction of the whole curve.
+///
+/// @param t          parameter
+/// @param a, b, c, d power form
+/// @return the direction, of no meaningful length; (1, 0) for a curve whose last chord is exactly zero
+[[nodiscard]] ZARNMATH_API vector2d SafeBezierTangent(double t, const point2d& a, const point2d& b, const point2d& c,
+                                                      const point2d& d) noexcept;
+
+/// @}
+/// @name Length
+/// Arc length by one pass of Gauss-Legendre quadrature of the speed, without control of the error. The nodes and weights
+/// are kept short, most of them at eight decimal places: at orders 5, 6 and 10 a straight unit segment is off by 1e-08
+/// already. A curve with a sharp turn between samples is off by far more.
+///
+/// The squared speed is evaluated as a quartic: where it all but vanishes, rounding can take it below zero, and the length
+/// is then NaN.
+/// @{
+
+/// The length of a stretch.
+///
+/// @param a, b, c power form
+/// @param order   number of samples: below 2 counts as 2, 9 as 10, above 10 as 16
+/// @param t0, t1  the stretch; beyond [0, 1] that of the extended polynomial
+/// @return the length, negative for t1 < t0
+[[nodiscard]] ZARNMATH_API double Length(const point2d& a, const point2d& b, const point2d& c, int order, double t0,
+                                         double t1) noexcept;
+
+/// The length from 0 to 1.
+///
+/// @param a, b, c  power form
+/// @param accuracy number of samples
+/// @return the length
+[[nodiscard]] ZARNMATH_API double Length(const point2d& a, const point2d& b, const point2d& c,
+                                         LengthAccuracy accuracy) noexcept;
+
+/// The length from 0 to 1; for `point2d`.
+///
+/// @param curve    four control points
+/// @param accuracy number of samples
+/// @return the length
+template <typename P>
+[[nodiscard]] double Length(const P* curve, LengthAccuracy accuracy) noexcept;
+
+extern template ZARNMATH_API double Length<point2d>(const point2d*, LengthAccuracy) noexcept;
+
+/// The length from 0 to t, of the piece that `LeftOf` cuts, with ten samples.
+///
+/// @param t     parameter; outside [0, 1] the piece is extrapolated
+/// @param curve four control points; the piece of an integer curve is not rounded
+/// @return the length, exactly 0.0 for t = 0
+[[nodiscard]] ZARNMATH_API double LengthTo(double t, const point2d* curve) noexcept;
+[[nodiscard]] ZARNMATH_API double LengthTo(double t, const POINT* curve) noexcept;
+
+/// The length from t to 1, of the piece that `RightOf` cuts, with ten samples.
+///
+/// @param t     parameter; outside [0, 1] the piece is extrapolated
+/// @param curve four control points; the piece of an integer curve is not rounded
+/// @return the length, exactly 0.0 for t = 1
+[[nodiscard]] ZARNMATH_API double LengthFrom(double t, const point2d* curve) noexcept;
+[[nodiscard]] ZARNMATH_API double LengthFrom(double t, const POINT* curve) noexcept;
+
+/// The parameter up to which a cubic has a given fraction of its length.
+///
+/// A bracketed false position, whose first pass bisects and whose others move by at least 1e-04 of the bracket, from
+/// either end of it. Each pass takes the length from 0 anew.
+///
+/// @param fraction  of the length from 0 to 1; at most 0 gives 0.0, at least 1 gives 1.0
+/// @param a, b, c   power form
+/// @param tolerance the search ends once the length is off by no more, in drawing units, or an end of the bracket is
+///                  within DBL_EPSILON. After 200 passes it ends as well, and with a tolerance of 0 usually so
+/// @param accuracy  number of samples
+/// @return the parameter; 0.5 for a curve of no length
+[[nodiscard]] ZARNMATH_API double GetCurveRelativeLengthParameter(double fraction, point2d a, point2d b, point2d c,
+                                                                  double tolerance, LengthAccuracy accuracy) noexcept;
 
 /// @}
 /// @name Closest point and side
@@ -214,6 +401,73 @@ ZARNMATH_API bool Invert(const point2d& a, const point2d& b, const point2d& c, c
 /// @return the number of parameters
 ZARNMATH_API int FindTangentsToPoint(const point2d& a, const point2d& b, const point2d& c, const point2d& d,
                                      const point2d& q, double* parameters) noexcept;
+
+/// @}
+/// @name Directions and extents
+/// Where the tangent has a given direction, as the roots of a quadratic: its leading coefficient counts as zero up to
+/// 1e-9, so that a root far outside the segment, and on tiny curves one inside it, is lost.
+/// @{
+
+/// The parameters in (0, 1) at which the tangent is vertical, where x has an extreme.
+///
+/// @param a, b, c            power form
+/// @param[in,out] parameters at most two are appended, in ascending order. The ends of the curve are never among them, and
+///                           nothing is for a vertical straight curve
+ZARNMATH_API void GetVerticalTangents(const point2d& a, const point2d& b, const point2d& c,
+                                      std::vector<double>& parameters);
+
+/// The parameters in (0, 1) at which the tangent is horizontal, where y has an extreme.
+///
+/// @param a, b, c            power form
+/// @param[in,out] parameters at most two are appended, in ascending order. The ends of the curve are never among them, and
+///                           nothing is for a horizontal straight curve
+ZARNMATH_API void GetHorizontalTangents(const point2d& a, const point2d& b, const point2d& c,
+                                        std::vector<double>& parameters);
+
+/// The parameters in [0, 1] at which the tangent is parallel to a direction, either way along it.
+///
+/// @param a, b, c            power form
+/// @param direction          the direction, of any length. The zero vector is parallel to everything
+/// @param[in,out] parameters at most two are appended, in ascending order; a double root at 0 is appended twice
+/// @param[out] allParallel   whether the tangent is parallel to the direction everywhere, each coefficient of the quadratic
+///                           being at most DBL_EPSILON; nothing is appended then
+ZARNMATH_API void GetParallels(const point2d& a, const point2d& b, const point2d& c, const vector2d& direction,
+                               std::vector<double>& parameters, bool& allParallel);
+
+/// The signed area between a cubic and the x axis, the exact integral of y dx from t = 0 to t = 1.
+///
+/// Positive where the curve runs above the axis with x increasing. The sum over a closed outline is the area that it
+/// encloses, positive for a clockwise one.
+///
+/// @param a, b, c, d power form
+/// @return the area, in drawing units squared
+[[nodiscard]] ZARNMATH_API double GetAreaUnderBezier(const point2d& a, const point2d& b, const point2d& c,
+                                                     const point2d& d) noexcept;
+
+/// The point at a distance from a cubic, square to its direction.
+///
+/// @param bezier        four control points
+/// @param t             parameter; outside [0, 1] the curve is extrapolated
+/// @param offset, scale the product is the distance, positive to the left of the direction of travel
+/// @return P(t) + offset*scale*Perpendicular(n), with n the normalised `SafeBezierTangent`. Where that is too short to be
+///         normalised, the point lies nearer
+[[nodiscard]] ZARNMATH_API point2d MapToBezier(const point2d* bezier, double t, double offset, double scale) noexcept;
+
+/// @}
+/// @name Offset cusps
+/// The offset of a cubic by a signed distance, P(t) + distance*n(t) with n the left normal, turns back on itself where the
+/// radius of curvature equals the distance.
+/// @{
+
+/// The parameters in (0, 1) at which the offset of a cubic has a cusp.
+///
+/// @param a, b, c         power form
+/// @param distance        positive to the left of the direction of travel; 0 has no cusps
+/// @param[out] parameters cleared, then filled in the root finder's order, with at most 12 values
+/// @return whether there is any. A double root, where the radius only touches the distance, may be listed once, twice or
+///         not at all, and so may a zero of the speed, which counts for positive distances
+ZARNMATH_API bool FindOffsetCusps(const point2d& a, const point2d& b, const point2d& c, double distance,
+                                  std::vector<double>& parameters);
 
 /// @}
 

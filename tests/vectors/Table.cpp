@@ -35,7 +35,10 @@ Table MakeTable()
     AddBezierToLinesAdapters(table);
     AddBoundsAdapters(table);
     AddClosestPointAdapters(table);
+    AddCurvatureAdapters(table);
     AddCuttingAdapters(table);
+    AddExtentsAdapters(table);
+    AddLengthAdapters(table);
     AddLineAdapters(table);
     AddPlatformAdapters(table);
     AddRootFinderAdapters(table);
