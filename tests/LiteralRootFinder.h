@@ -1,103 +1,101 @@
 /// @file
-/// The root finder in its plainest form: the degree is a number, every sum is a loop, and each root is polished where it
-/// is found. It defines what the library's fast one has to give, bit for bit.
+/// The root finder in its plainest form: polygons on the stack, every sum a loop, each root polished where it is found.
+/// It says what the library's fast one has to give, bit for bit, and how long the obvious way takes.
 #pragma once
 
 #include "ZarnMath/ValueTypes.h"
 
 #include <algorithm>
 #include <cmath>
-#include <cstring>
-#include <vector>
 
 namespace ZarnMath::Literal {
 
-using Polygon = std::vector<vector2d>;
+/// C(n, k), the rows of Pascal's triangle from 0 to 12.
+inline constexpr double binomials[13][13] = {
+    {1},
+    {1, 1},
+    {1, 2, 1},
+    {1, 3, 3, 1},
+    {1, 4, 6, 4, 1},
+    {1, 5, 10, 10, 5, 1},
+    {1, 6, 15, 20, 15, 6, 1},
+    {1, 7, 21, 35, 35, 21, 7, 1},
+    {1, 8, 28, 56, 70, 56, 28, 8, 1},
+    {1, 9, 36, 84, 126, 126, 84, 36, 9, 1},
+    {1, 10, 45, 120, 210, 252, 210, 120, 45, 10, 1},
+    {1, 11, 55, 165, 330, 462, 462, 330, 165, 55, 11, 1},
+    {1, 12, 66, 220, 495, 792, 924, 792, 495, 220, 66, 12, 1},
+};
 
-inline double BinomialCoefficient(int n, int k)
+template <int N>
+void ToBernstein(const double* c, vector2d* bez)
 {
-    double value = 1.0;
-    for (int i = 0; i < k; ++i)
-        value = value * (n - i) / (i + 1);
-    return value;
-}
-
-inline Polygon ToBernstein(int degree, const double* c)
-{
-    Polygon bez(static_cast<std::size_t>(degree) + 1);
-    for (int k = 0; k <= degree; ++k) {
-        const double a = c[degree - k];
-        double y = a;
-        if (k > 0) {
-            double s = bez[0].y;
-            for (int j = 1; j < k; ++j)
-                s = BinomialCoefficient(k, j) * bez[static_cast<std::size_t>(j)].y - s;
-            y = a / BinomialCoefficient(degree, k) + s;
-        }
-        bez[static_cast<std::size_t>(k)] = {static_cast<double>(k) / static_cast<double>(degree), y};
+    bez[0] = {0.0, c[N]};
+    for (int k = 1; k <= N; ++k) {
+        double s = bez[0].y;
+        for (int j = 1; j < k; ++j)
+            s = binomials[k][j] * bez[j].y - s;
+        bez[k] = {static_cast<double>(k) / static_cast<double>(N), c[N - k] / binomials[N][k] + s};
     }
-    return bez;
 }
 
-inline int CountCrossings(const Polygon& bez, int& lastCrossing)
+template <int N>
+int CountCrossings(const vector2d* bez, int& lastCrossing)
 {
     int count = 0;
-    for (std::size_t i = 0; i + 1 < bez.size(); ++i) {
+    for (int i = 0; i < N; ++i) {
         const bool leg = bez[i].y * bez[i + 1].y < 0.0;
         const bool zero = i > 0 && bez[i].y == 0.0 && bez[i + 1].y * bez[i - 1].y < 0.0;
         if (leg || zero) {
             ++count;
-            lastCrossing = static_cast<int>(i);
+            lastCrossing = i;
         }
     }
     return count;
 }
 
-/// de Casteljau's triangle with a step of the caller's; the cut point ends the left and starts the right polygon.
-template <typename Step>
-void Cut(const Polygon& bez, Polygon& left, Polygon& right, Step step)
+/// de Casteljau's triangle with a step of the caller's: its left side, and its right side from the apex on.
+template <int N, typename Step>
+void Cut(const vector2d* bez, vector2d* left, vector2d* right, Step step)
 {
-    Polygon row = bez;
-    left.clear();
-    right.clear();
-    while (true) {
-        left.push_back(row.front());
-        right.push_back(row.back());
-        if (row.size() == 1)
-            break;
-        Polygon next;
-        for (std::size_t i = 0; i + 1 < row.size(); ++i)
-            next.push_back({step(row[i].x, row[i + 1].x), step(row[i].y, row[i + 1].y)});
-        row = next;
+    vector2d row[N + 1];
+    std::copy(bez, bez + N + 1, row);
+    for (int last = N; last >= 0; --last) {
+        left[N - last] = row[0];
+        right[last] = row[last];
+        for (int i = 0; i < last; ++i)
+            row[i] = step(row[i], row[i + 1]);
     }
-    std::reverse(right.begin(), right.end());
 }
 
-inline double Value(int degree, const double* c, double t)
+template <int N>
+double Value(const double* c, double t)
 {
     double value = c[0];
-    for (int i = 1; i <= degree; ++i)
+    for (int i = 1; i <= N; ++i)
         value = c[i] + t * value;
     return value;
 }
 
-inline double Slope(int degree, const double* c, double t)
+template <int N>
+double Slope(const double* c, double t)
 {
-    double value = degree * c[0];
-    for (int i = 1; i < degree; ++i)
-        value = (degree - i) * c[i] + t * value;
+    double value = N * c[0];
+    for (int i = 1; i < N; ++i)
+        value = (N - i) * c[i] + t * value;
     return value;
 }
 
-inline bool Newton(int degree, const double* c, double start, double tolerance, double& root)
+template <int N>
+bool Newton(const double* c, double start, double tolerance, double& root)
 {
     double t = start;
     double previous = 1.0;
     for (int n = 200;; --n) {
-        const double d = Slope(degree, c, t);
+        const double d = Slope<N>(c, t);
         if (d == 0.0)
             return false;
-        const double next = t - Value(degree, c, t) / d;
+        const double next = t - Value<N>(c, t) / d;
         const double delta = std::fabs(t - next);
         if (delta < tolerance) {
             root = next;
@@ -110,16 +108,17 @@ inline bool Newton(int degree, const double* c, double start, double tolerance, 
     }
 }
 
-inline double NewtonGuaranteed(int degree, const double* c, double start, double lower, double upper, double tolerance)
+template <int N>
+double NewtonGuaranteed(const double* c, double start, double lower, double upper, double tolerance)
 {
     double t = start;
     double previous = 1.0;
     int n = 101;
     while (true) {
-        const double d = Slope(degree, c, t);
+        const double d = Slope<N>(c, t);
         if (d == 0.0)
             return start;
-        const double next = t - Value(degree, c, t) / d;
+        const double next = t - Value<N>(c, t) / d;
         const double delta = std::fabs(t - next);
         if (!(delta < tolerance)) {
             if (delta >= previous)
@@ -134,23 +133,26 @@ inline double NewtonGuaranteed(int degree, const double* c, double start, double
     }
 }
 
-/// Whether two polygons are the same, with any NaN equal to any other.
-inline bool AreSame(const Polygon& p, const Polygon& q)
+inline bool HasSameBits(double a, double b)
 {
-    const auto same = [](double a, double b) {
-        return (a != a && b != b) || std::memcmp(&a, &b, sizeof a) == 0;
-    };
-    for (std::size_t i = 0; i < p.size(); ++i)
-        if (!same(p[i].x, q[i].x) || !same(p[i].y, q[i].y))
+    return a != a ? b != b : a == b && std::signbit(a) == std::signbit(b);
+}
+
+template <int N>
+bool AreSame(const vector2d* p, const vector2d* q)
+{
+    for (int i = 0; i <= N; ++i)
+        if (!HasSameBits(p[i].x, q[i].x) || !HasSameBits(p[i].y, q[i].y))
             return false;
     return true;
 }
 
-inline void Solve(int degree, const Polygon& bez, const double* c, double* roots, int& count)
+template <int N>
+void Solve(const vector2d* bez, const double* c, double* roots, int& count)
 {
-    const double width = bez.back().x - bez.front().x;
+    const double width = bez[N].x - bez[0].x;
     int lastCrossing = -1;
-    const int n = CountCrossings(bez, lastCrossing);
+    const int n = CountCrossings<N>(bez, lastCrossing);
     if (!(width > DBL_EPSILON)) {
         if (n >= 1)
             roots[count++] = bez[0].x;
@@ -161,41 +163,40 @@ inline void Solve(int degree, const Polygon& bez, const double* c, double* roots
             roots[count++] = bez[0].x;
         return;
     }
-    const vector2d& from = bez[static_cast<std::size_t>(lastCrossing)];
-    const vector2d& to = bez[static_cast<std::size_t>(lastCrossing) + 1];
+    const vector2d from = bez[lastCrossing];
+    const vector2d to = bez[lastCrossing + 1];
     if (n == 1) {
         const double start = from.x - (to.x - from.x) * (from.y / (to.y - from.y));
-        roots[count++] = NewtonGuaranteed(degree, c, start, bez.front().x, bez.back().x, 1e-07);
+        roots[count++] = NewtonGuaranteed<N>(c, start, bez[0].x, bez[N].x, 1e-07);
         return;
     }
     if (n == 2 && width < 2e-07) {
-        std::vector<double> derivative;
-        for (int i = 0; i < degree; ++i)
-            derivative.push_back(c[i] * (degree - i));
+        double derivative[N];
+        for (int i = 0; i < N; ++i)
+            derivative[i] = c[i] * (N - i);
         double root = -1.0;
-        const double start = (bez.front().x - bez.back().x) * 0.5;
-        if (Newton(degree - 1, derivative.data(), start, 1e-07, root) &&
-            std::fabs(Value(degree, c, root)) < 1e-07) {
+        if (Newton<N - 1>(derivative, (bez[0].x - bez[N].x) * 0.5, 1e-07, root) &&
+            std::fabs(Value<N>(c, root)) < 1e-07) {
             roots[count++] = root;
             return;
         }
     }
-    Polygon left;
-    Polygon right;
+    vector2d left[N + 1];
+    vector2d right[N + 1];
     if (n == 2) {
-        const double u = (from.x - bez.front().x) / width;
-        Cut(bez, left, right, [u](double p, double q) { return p + (q - p) * u; });
+        const double u = (from.x - bez[0].x) / width;
+        Cut<N>(bez, left, right, [u](const vector2d& p, const vector2d& q) { return p + (q - p) * u; });
     } else {
-        Cut(bez, left, right, [](double p, double q) { return (p + q) * 0.5; });
+        Cut<N>(bez, left, right, [](const vector2d& p, const vector2d& q) { return (p + q) * 0.5; });
     }
-    if (AreSame(left, bez) || AreSame(right, bez)) {
+    if (AreSame<N>(left, bez) || AreSame<N>(right, bez)) {
         roots[count++] = bez[0].x;
         return;
     }
-    Solve(degree, left, c, roots, count);
-    if (count > degree - 1)
+    Solve<N>(left, c, roots, count);
+    if (count > N - 1)
         return;
-    Solve(degree, right, c, roots, count);
+    Solve<N>(right, c, roots, count);
 }
 
 inline int FindQuadraticRoots(const double* c, double* roots, bool includeEndpoints)
@@ -240,34 +241,38 @@ inline int FindQuadraticRoots(const double* c, double* roots, bool includeEndpoi
     return count;
 }
 
-inline int FindRoots(int degree, const double* c, double* roots, bool includeEndpoints)
+template <int N>
+int FindRoots(const double* c, double* roots, bool includeEndpoints)
 {
-    if (degree == 2)
+    if constexpr (N == 2) {
         return FindQuadraticRoots(c, roots, includeEndpoints);
-    if (c[0] == 0.0)
-        return FindRoots(degree - 1, c + 1, roots, includeEndpoints);
-    if (c[degree] == 0.0) {
-        const int n = FindRoots(degree - 1, c, roots, includeEndpoints);
-        if (!includeEndpoints || c[degree - 1] == 0.0)
-            return n;
-        if (n >= 1 && std::fabs(roots[0]) <= 1e-07) {
-            roots[0] = 0.0;
-            return n;
+    } else {
+        if (c[0] == 0.0)
+            return FindRoots<N - 1>(c + 1, roots, includeEndpoints);
+        if (c[N] == 0.0) {
+            const int n = FindRoots<N - 1>(c, roots, includeEndpoints);
+            if (!includeEndpoints || c[N - 1] == 0.0)
+                return n;
+            if (n >= 1 && std::fabs(roots[0]) <= 1e-07) {
+                roots[0] = 0.0;
+                return n;
+            }
+            if (n >= 1 && n > N - 2)
+                return n;
+            roots[n] = 0.0;
+            std::stable_sort(roots, roots + n + 1);
+            return n + 1;
         }
-        if (n >= 1 && n > degree - 2)
-            return n;
-        roots[n] = 0.0;
-        std::stable_sort(roots, roots + n + 1);
-        return n + 1;
+        vector2d bez[N + 1];
+        ToBernstein<N>(c, bez);
+        int count = 0;
+        if (includeEndpoints && IsNearZero(bez[0].y))
+            roots[count++] = 0.0;
+        Solve<N>(bez, c, roots, count);
+        if (includeEndpoints && IsNearZero(bez[N].y))
+            roots[count++] = 1.0;
+        return count;
     }
-    const Polygon bez = ToBernstein(degree, c);
-    int count = 0;
-    if (includeEndpoints && IsNearZero(bez.front().y))
-        roots[count++] = 0.0;
-    Solve(degree, bez, c, roots, count);
-    if (includeEndpoints && IsNearZero(bez.back().y))
-        roots[count++] = 1.0;
-    return count;
 }
 
 } // namespace ZarnMath::Literal

@@ -21,7 +21,8 @@
 namespace ZarnMath {
 
 /// Where a point lies, seen along the direction of travel.
-enum Side : std::int32_t {
+enum Side : std::int32_t
+{
     SideNone = 0,     ///< on the tangent line, or nothing could be found
     SidePositive = 1, ///< to the left: Cross(tangent, q - closest) > 0
     SideNegative = 2, ///< to the right

@@ -7,24 +7,38 @@
 /// often than its polygon does (variation diminishing; Lane and Riesenfeld, 1981), so that a polygon with no sign change
 /// has no root, one with a single change has one, which Newton's method polishes, and every other one is cut.
 ///
-/// Everything runs on fixed-size arrays of the stack and allocates nothing.
+/// Everything runs on fixed-size arrays of the stack and allocates nothing. All loops have a length known to the
+/// compiler and are unrolled: that alone is worth a factor of two here.
 #pragma once
 
-#include "ZarnMath/ValueTypes.h"
+#include "ZarnMath/Bezier/Pair.h"
+
+#include <bit>
 
 namespace ZarnMath::RootFinder {
 
 /// The length of a Newton step, and the distance from 0, at which a root counts as found.
 inline constexpr double rootTolerance = 1e-07;
 
-/// C(n, k) as a double.
-[[nodiscard]] constexpr double Binomial(int n, int k) noexcept
+/// The highest degree that is instantiated.
+inline constexpr int highestDegree = 12;
+
+/// The rows of Pascal's triangle, C(n, k), up to the highest degree.
+struct PascalTriangle
 {
-    double value = 1.0;
-    for (int i = 1; i <= k; ++i)
-        value = value * (n - k + i) / i;
-    return value;
-}
+    double c[highestDegree + 1][highestDegree + 1]{};
+
+    constexpr PascalTriangle() noexcept
+    {
+        for (int n = 0; n <= highestDegree; ++n) {
+            c[n][0] = 1.0;
+            for (int k = 1; k <= n; ++k)
+                c[n][k] = c[n - 1][k - 1] + c[n - 1][k];
+        }
+    }
+};
+
+inline constexpr PascalTriangle binomial;
 
 /// The conversion of coefficients to a control polygon; M is the first control point that is computed.
 template <int N, int M>
@@ -32,96 +46,124 @@ struct PolynomialToBernsteinT
 {
     /// Fills bez[M] to bez[N].
     ///
-    /// The k-th forward difference of the ordinates is a_k / C(N, k), with a_k the coefficient of t^k. Solved for the
-    /// ordinate k from low to high, by s = C(k, j)*b_j - s over j = 1 to k - 1, starting from b_0. The sums for all k
-    /// advance side by side, which leaves each of them as it is.
+    /// The k-th forward difference of the ordinates is a_k / C(N, k), with a_k the coefficient of t^k. Solved for b_k
+    /// from low k to high, with s = C(k, j)*b_j - s over j = 1 to k - 1 from s = b_0 on, this is b_k = a_k / C(N, k) + s.
+    /// The sums of all k advance side by side, which leaves each of them as it is.
     ///
     /// @param c   N + 1 coefficients, of which c[0] to c[N-M] are read
     /// @param bez N + 1 points, of which 0 to M - 1 stand already
-    static constexpr void Convert(const double* c, vector2d* bez) noexcept
+    static void Convert(const double* c, vector2d* bez) noexcept
     {
-        double b[N + 1]{};
-        double s[N + 1]{};
-        for (int k = 0; k <= N; ++k) {
-            if (k < M)
-                b[k] = bez[k].y;
-            else if (k == 0)
-                b[k] = c[N];
-            else
-                b[k] = c[N - k] / Binomial(N, k) + s[k];
+        double b[N + 1];
+        double s[N + 1];
+        b[0] = M > 0 ? bez[0].y : c[N];
+#pragma GCC unroll 16
+        for (int k = 1; k <= N; ++k)
+            s[k] = b[0];
+#pragma GCC unroll 16
+        for (int k = 1; k <= N; ++k) {
+            b[k] = k < M ? bez[k].y : c[N - k] / binomial.c[N][k] + s[k];
+#pragma GCC unroll 16
             for (int i = k + 1; i <= N; ++i)
-                s[i] = k == 0 ? b[0] : Binomial(i, k) * b[k] - s[i];
+                s[i] = binomial.c[i][k] * b[k] - s[i];
         }
+#pragma GCC unroll 16
         for (int k = M; k <= N; ++k)
-            bez[k] = {static_cast<double>(k) / static_cast<double>(N), b[k]};
+            StorePair(bez[k], Pair{static_cast<double>(k) / static_cast<double>(N), b[k]});
     }
 };
 
-/// The number of sign changes of a control polygon.
+/// The sign changes of a control polygon, bit i for one that is charged to index i.
 ///
 /// An ordinate of exactly 0 between two of opposite sign is one change, charged to the zero's index. Two zeros in a row
-/// hide a change, and a zero at an end is none. All comparisons are exact.
+/// hide a change, and a zero at an end is none. All comparisons are exact; so is the product that takes them, down to
+/// its underflow, which hides a change too.
+///
+/// @param bez N + 1 points
+template <int N>
+[[nodiscard]] inline unsigned SignChanges(const vector2d* bez) noexcept
+{
+    unsigned changes = 0;
+    unsigned zeros = 0;
+#pragma GCC unroll 16
+    for (int i = 0; i < N; ++i) {
+        changes |= static_cast<unsigned>(bez[i].y * bez[i + 1].y < 0.0) << i;
+        zeros |= static_cast<unsigned>(bez[i].y == 0.0) << i;
+    }
+    if (zeros > 1) [[unlikely]]
+        for (int i = 1; i < N; ++i)
+            changes |= static_cast<unsigned>(bez[i].y == 0.0 && bez[i + 1].y * bez[i - 1].y < 0.0) << i;
+    return changes;
+}
+
+/// The index of the last of the changes; there is at least one.
+[[nodiscard]] inline int LastChange(unsigned changes) noexcept
+{
+    return 31 - std::countl_zero(changes);
+}
+
+/// The number of sign changes of a control polygon.
 ///
 /// @param bez                  N + 1 points
 /// @param[out] lastCrossing    index of the leg, or of the zero, of the last change; untouched if there is none
 template <int N>
-[[nodiscard]] constexpr int CrossingCount(const vector2d* bez, int& lastCrossing) noexcept
+[[nodiscard]] inline int CrossingCount(const vector2d* bez, int& lastCrossing) noexcept
 {
-    int count = 0;
-    for (int i = 0; i < N; ++i) {
-        const bool crosses = bez[i].y * bez[i + 1].y < 0.0 ||
-                             (i > 0 && bez[i].y == 0.0 && bez[i + 1].y * bez[i - 1].y < 0.0);
-        if (crosses) {
-            ++count;
-            lastCrossing = i;
-        }
-    }
-    return count;
+    const unsigned changes = SignChanges<N>(bez);
+    if (changes != 0)
+        lastCrossing = LastChange(changes);
+    return std::popcount(changes);
 }
 
-/// The cut of a control polygon in two, by de Casteljau's construction on both coordinates.
+/// The cut of a control polygon in two, by de Casteljau's construction on both coordinates at once.
 template <int N>
 struct SplitBezierT
 {
     /// Cuts at a parameter relative to the polygon, by steps p + (q - p)*t.
     ///
-    /// @param interior     the N - 1 points between the ends of the polygon
-    /// @param t            in (0, 1)
+    /// @param interior      the N - 1 points between the ends of the polygon
+    /// @param t             in (0, 1)
     /// @param[in,out] left  N + 1 points; left[0] is the start of the polygon already
     /// @param[in,out] right N + 1 points; right[N] is the end of the polygon already
-    static constexpr void Split(const vector2d* interior, double t, vector2d* left, vector2d* right) noexcept
+    static void Split(const vector2d* interior, double t, vector2d* left, vector2d* right) noexcept
     {
-        Construct(interior, left, right, [t](const vector2d& p, const vector2d& q) { return p + (q - p) * t; });
+        const Pair u = Both(t);
+        Construct(interior, left, right, [u](Pair p, Pair q) { return p + (q - p) * u; });
     }
 
     /// Cuts in the middle, by steps (p + q)*0.5: not the cut at t = 0.5.
-    static constexpr void Split(const vector2d* interior, vector2d* left, vector2d* right) noexcept
+    static void Split(const vector2d* interior, vector2d* left, vector2d* right) noexcept
     {
-        Construct(interior, left, right, [](const vector2d& p, const vector2d& q) { return (p + q) * 0.5; });
+        Construct(interior, left, right, [](Pair p, Pair q) { return (p + q) * Both(0.5); });
     }
 
 private:
     template <typename Step>
-    static constexpr void Construct(const vector2d* interior, vector2d* left, vector2d* right, Step step) noexcept
+    static void Construct(const vector2d* interior, vector2d* left, vector2d* right, Step step) noexcept
     {
+        Pair row[N + 1];
+        row[0] = LoadPair(left[0]);
+        row[N] = LoadPair(right[N]);
+#pragma GCC unroll 16
         for (int i = 1; i < N; ++i)
-            right[i - 1] = interior[i - 1];
-        vector2d first = left[0];
-        for (int level = 1; level <= N; ++level) {
-            first = step(first, right[0]);
-            left[level] = first;
-            for (int i = 0; i < N - level; ++i)
-                right[i] = step(right[i], right[i + 1]);
+            row[i] = LoadPair(interior[i - 1]);
+#pragma GCC unroll 16
+        for (int last = N - 1; last >= 0; --last) {
+#pragma GCC unroll 16
+            for (int i = 0; i <= last; ++i)
+                row[i] = step(row[i], row[i + 1]);
+            StorePair(left[N - last], row[0]);
+            StorePair(right[last], row[last]);
         }
-        right[0] = first;
     }
 };
 
 /// p(t) by Horner's rule, from the highest power inward.
 template <int N>
-[[nodiscard]] constexpr double Value(const double* c, double t) noexcept
+[[nodiscard]] inline double Value(const double* c, double t) noexcept
 {
     double value = c[0];
+#pragma GCC unroll 16
     for (int i = 1; i <= N; ++i)
         value = c[i] + t * value;
     return value;
@@ -133,8 +175,9 @@ struct Derivative
 {
     double c[N];
 
-    explicit constexpr Derivative(const double* p) noexcept
+    explicit Derivative(const double* p) noexcept
     {
+#pragma GCC unroll 16
         for (int i = 0; i < N; ++i)
             c[i] = p[i] * (N - i);
     }
@@ -148,27 +191,28 @@ struct Derivative
 /// @param[out] root  the last iterate, which may lie anywhere; untouched without convergence
 /// @return whether the search converged
 template <int N>
-[[nodiscard]] constexpr bool FindSolutionNewtonsMethod(const double* c, double start, double tolerance,
-                                                       double& root) noexcept
+[[nodiscard]] inline bool FindSolutionNewtonsMethod(const double* c, double start, double tolerance,
+                                                    double& root) noexcept
 {
     const Derivative<N> derivative(c);
     double t = start;
     double previous = 1.0;
-    for (int n = 200;; --n) {
-        const double d = Value<N - 1>(derivative.c, t);
-        if (d == 0.0)
+    for (int stepsLeft = 200; stepsLeft > 0; --stepsLeft) {
+        const double slope = Value<N - 1>(derivative.c, t);
+        if (slope == 0.0)
             return false;
-        const double next = t - Value<N>(c, t) / d;
-        const double delta = next < t ? t - next : next - t;
+        const double next = t - Value<N>(c, t) / slope;
+        const double delta = std::fabs(t - next);
         if (delta < tolerance) {
             root = next;
             return true;
         }
-        if (n < 2 || delta >= previous)
+        if (!(delta < previous)) // NaN, too, would last until the steps run out
             return false;
         previous = delta;
         t = next;
     }
+    return false;
 }
 
 /// Newton's method, at most 100 steps, that always gives a value to go on with.
@@ -182,26 +226,29 @@ template <int N>
 /// @return the last iterate, or at a divergence the one before the step that grew, if strictly within the bounds;
 ///         otherwise start, wherever it lies
 template <int N>
-[[nodiscard]] constexpr double FindSolutionNewtonsMethod_Guaranteed(const double* c, double start, double lower,
-                                                                    double upper, double tolerance) noexcept
+[[nodiscard]] inline double FindSolutionNewtonsMethod_Guaranteed(const double* c, double start, double lower,
+                                                                 double upper, double tolerance) noexcept
 {
     const auto orStart = [=](double value) { return lower < value && value < upper ? value : start; };
     const Derivative<N> derivative(c);
     double t = start;
     double previous = 1.0;
-    for (int n = 100;; --n) {
-        const double d = Value<N - 1>(derivative.c, t);
-        if (d == 0.0)
+    for (int stepsLeft = 100; stepsLeft > 0; --stepsLeft) {
+        const double slope = Value<N - 1>(derivative.c, t);
+        if (slope == 0.0)
             return start;
-        const double next = t - Value<N>(c, t) / d;
-        const double delta = next < t ? t - next : next - t;
-        if (!(delta < tolerance) && delta >= previous)
-            return orStart(t);
-        if (delta < tolerance || n == 1)
+        const double next = t - Value<N>(c, t) / slope;
+        const double delta = std::fabs(t - next);
+        if (delta < tolerance)
             return orStart(next);
+        if (delta >= previous)
+            return orStart(t);
+        if (std::isnan(delta)) // it would last until the steps run out
+            return start;
         previous = delta;
         t = next;
     }
+    return orStart(t);
 }
 
 /// The roots of a polynomial, from a stretch of its control polygon on; for N from 3 to 12.
@@ -209,7 +256,7 @@ template <int N>
 /// @param bez            N + 1 points
 /// @param c              N + 1 coefficients of the whole polynomial
 /// @param[in,out] roots  the roots are appended, left before right
-/// @param[in,out] count  the number of roots in the array; the search stops once it holds N
+/// @param[in,out] count  the number of roots in the array, not negative; the search stops once it holds N
 template <int N>
 void SolvePolynomial_BezierDivide_NewtonsMethod(const vector2d* bez, const double* c, double* roots,
                                                 int& count) noexcept;
@@ -230,5 +277,19 @@ void SolvePolynomial_BezierDivide_NewtonsMethod(const vector2d* bez, const doubl
 /// @return the number of roots
 template <int N>
 int FindRoots(const double* c, double* roots, bool includeEndpoints) noexcept;
+
+template <>
+int FindRoots<2>(const double* c, double* roots, bool includeEndpoints) noexcept;
+
+extern template int FindRoots<3>(const double*, double*, bool) noexcept;
+extern template int FindRoots<4>(const double*, double*, bool) noexcept;
+extern template int FindRoots<5>(const double*, double*, bool) noexcept;
+extern template int FindRoots<6>(const double*, double*, bool) noexcept;
+extern template int FindRoots<7>(const double*, double*, bool) noexcept;
+extern template int FindRoots<8>(const double*, double*, bool) noexcept;
+extern template int FindRoots<9>(const double*, double*, bool) noexcept;
+extern template int FindRoots<10>(const double*, double*, bool) noexcept;
+extern template int FindRoots<11>(const double*, double*, bool) noexcept;
+extern template int FindRoots<12>(const double*, double*, bool) noexcept;
 
 } // namespace ZarnMath::RootFinder

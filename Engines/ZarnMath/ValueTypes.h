@@ -130,23 +130,20 @@ template <typename T>
 }
 
 template <typename T>
-[[nodiscard]] constexpr vector2dT<T, false> operator*(const vector2dT<T, false>& v,
-                                                      std::type_identity_t<T> s) noexcept
+[[nodiscard]] constexpr vector2dT<T, false> operator*(const vector2dT<T, false>& v, std::type_identity_t<T> s) noexcept
 {
     return {v.x * s, v.y * s};
 }
 
 template <typename T>
-[[nodiscard]] constexpr vector2dT<T, false> operator*(std::type_identity_t<T> s,
-                                                      const vector2dT<T, false>& v) noexcept
+[[nodiscard]] constexpr vector2dT<T, false> operator*(std::type_identity_t<T> s, const vector2dT<T, false>& v) noexcept
 {
     return {s * v.x, s * v.y};
 }
 
 /// Divides each component; a multiplication by the reciprocal would round twice.
 template <typename T>
-[[nodiscard]] constexpr vector2dT<T, false> operator/(const vector2dT<T, false>& v,
-                                                      std::type_identity_t<T> s) noexcept
+[[nodiscard]] constexpr vector2dT<T, false> operator/(const vector2dT<T, false>& v, std::type_identity_t<T> s) noexcept
 {
     return {v.x / s, v.y / s};
 }

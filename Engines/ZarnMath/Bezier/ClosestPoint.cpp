@@ -214,11 +214,7 @@ int FindTangentsToPoint(const point2d& a, const point2d& b, const point2d& c, co
 {
     const vector2d offset = d - q;
     const double quartic[5] = {
-        Cross(a, b),
-        2.0 * Cross(a, c),
-        3.0 * Cross(a, offset) + Cross(b, c),
-        2.0 * Cross(b, offset),
-        Cross(c, offset),
+        Cross(a, b), 2.0 * Cross(a, c), 3.0 * Cross(a, offset) + Cross(b, c), 2.0 * Cross(b, offset), Cross(c, offset),
     };
     return RootFinder::FindRoots<4>(quartic, parameters, true);
 }

@@ -1,88 +1,206 @@
 #include "ZarnMath/RootFinder.h"
-#include <algorithm>
+
+#include "ZarnMath/Bezier/RootPolishing.h"
+
+#include <utility>
 
 namespace ZarnMath::RootFinder {
 
 namespace {
-bool SameBits(const vector2d* p, const vector2d* q, int n)
+
+/// Below this width two sign changes are taken for a double root.
+constexpr double sliverWidth = 2e-07;
+
+/// The leading coefficient up to which a quadratic counts as linear.
+constexpr double linearTolerance = 1e-09;
+
+[[nodiscard]] bool HasAtMostOneBit(unsigned bits) noexcept
 {
-    for (int i = 0; i < n; ++i) {
-        const auto same = [](double a, double b) { return (a != a && b != b) || (a == b && std::signbit(a) == std::signbit(b)); };
-        if (!same(p[i].x, q[i].x) || !same(p[i].y, q[i].y)) return false;
-    }
+    return (bits & (bits - 1)) == 0;
+}
+
+[[nodiscard]] bool HasSameBits(double a, double b) noexcept
+{
+    return std::isnan(a) ? std::isnan(b) : a == b && std::signbit(a) == std::signbit(b);
+}
+
+template <int N>
+[[nodiscard]] bool HasSameBits(const vector2d* p, const vector2d* q) noexcept
+{
+    for (int i = 0; i <= N; ++i)
+        if (!HasSameBits(p[i].x, q[i].x) || !HasSameBits(p[i].y, q[i].y))
+            return false;
     return true;
 }
+
+/// Whether one of the pieces is the polygon itself: rounding has moved the cut onto an end of a polygon a few last
+/// places wide, and cutting on would never end.
+template <int N>
+[[nodiscard]] bool IsWithoutProgress(const vector2d* bez, const vector2d* left, const vector2d* right) noexcept
+{
+    const double cut = left[N].x;
+    return (cut == bez[N].x && HasSameBits<N>(left, bez)) || (cut == bez[0].x && HasSameBits<N>(right, bez));
+}
+
+/// Isolates first and polishes afterwards: a single sign change yields exactly one root, so that its place among the
+/// roots is known before its value is.
+template <int N>
+class Search
+{
+public:
+    Search(const double* coefficients, double* rootArray, int rootCount) noexcept
+        : c(coefficients), roots(rootArray), count(rootCount)
+    {}
+
+    /// @return the number of roots in the array
+    [[nodiscard]] int Run(const vector2d* bez) noexcept
+    {
+        Isolate(bez);
+        Polish<N>(c, crossings, crossingCount, roots);
+        return count;
+    }
+
+private:
+    void Isolate(const vector2d* bez) noexcept
+    {
+        const double width = bez[N].x - bez[0].x;
+        const unsigned changes = SignChanges<N>(bez);
+        if (!(width > DBL_EPSILON)) {
+            if (changes != 0)
+                Append(bez[0].x);
+        } else if (changes == 0) {
+            if (bez[0].y == 0.0 && bez[1].y == 0.0) // the graph begins along the axis
+                Append(bez[0].x);
+        } else if (HasAtMostOneBit(changes)) {
+            AppendCrossing(bez, LastChange(changes));
+        } else {
+            Cut(bez, width, changes);
+        }
+    }
+
+    void Append(double root) noexcept
+    {
+        roots[count++] = root;
+    }
+
+    /// The start is where the chord of the leg i meets zero.
+    void AppendCrossing(const vector2d* bez, int i) noexcept
+    {
+        const vector2d from = bez[i];
+        const vector2d to = bez[i + 1];
+        const double start = from.x - (to.x - from.x) * (from.y / (to.y - from.y));
+        crossings[crossingCount++] = {start, bez[0].x, bez[N].x, count++};
+    }
+
+    /// Two sign changes are cut apart at the last one; more are cut in the middle.
+    void Cut(const vector2d* bez, double width, unsigned changes) noexcept
+    {
+        vector2d left[N + 1];
+        vector2d right[N + 1];
+        left[0] = bez[0];
+        right[N] = bez[N];
+        if (HasAtMostOneBit(changes & (changes - 1))) {
+            if (width < sliverWidth && AppendDoubleRoot(bez))
+                return;
+            const double t = (bez[LastChange(changes)].x - bez[0].x) / width;
+            SplitBezierT<N>::Split(bez + 1, t, left, right);
+        } else {
+            SplitBezierT<N>::Split(bez + 1, left, right);
+        }
+        if (IsWithoutProgress<N>(bez, left, right)) {
+            Append(bez[0].x);
+            return;
+        }
+        Isolate(left);
+        if (count > N - 1) // more sign changes than the degree come from rounding
+            return;
+        Isolate(right);
+    }
+
+    /// A double root is a root of the derivative at which the polynomial is small. The search for it starts at half the
+    /// negative width, a number near zero, and is not confined to the sliver.
+    [[nodiscard]] bool AppendDoubleRoot(const vector2d* bez) noexcept
+    {
+        const Derivative<N> derivative(c);
+        const double start = (bez[0].x - bez[N].x) * 0.5;
+        double root = -1.0;
+        if (!FindSolutionNewtonsMethod<N - 1>(derivative.c, start, rootTolerance, root))
+            return false;
+        if (!(std::fabs(Value<N>(c, root)) < rootTolerance))
+            return false;
+        Append(root);
+        return true;
+    }
+
+    const double* c;
+    double* roots;
+    int count;
+    int crossingCount = 0;
+    Crossing crossings[N];
+};
+
+/// By insertion: a handful of values, and an order that is the same with NaN among them on every machine.
+void SortAscending(double* values, int count) noexcept
+{
+    for (int i = 1; i < count; ++i)
+        for (int j = i; j > 0 && values[j] < values[j - 1]; --j)
+            std::swap(values[j], values[j - 1]);
+}
+
+/// Adds the root at t = 0 to those of p(t)/t, unless it is among them or the array has no room for it.
+template <int N>
+[[nodiscard]] int AddRootAtZero(double* roots, int count) noexcept
+{
+    if (count >= 1 && std::fabs(roots[0]) <= rootTolerance) {
+        roots[0] = 0.0;
+        return count;
+    }
+    if (count >= 1 && count > N - 2)
+        return count;
+    roots[count] = 0.0;
+    SortAscending(roots, count + 1);
+    return count + 1;
+}
+
+/// The unit interval, with or without its ends.
+struct UnitInterval
+{
+    bool includesEnds;
+
+    [[nodiscard]] bool Holds(double r) const noexcept
+    {
+        return includesEnds ? 0.0 <= r && r <= 1.0 : 0.0 < r && r < 1.0;
+    }
+
+    /// Stores the only candidate, which stays there even if the interval does not hold it.
+    [[nodiscard]] int StoreSingle(double r, double* roots) const noexcept
+    {
+        roots[0] = r;
+        return Holds(r) ? 1 : 0;
+    }
+};
+
 } // namespace
 
 template <int N>
 void SolvePolynomial_BezierDivide_NewtonsMethod(const vector2d* bez, const double* c, double* roots,
                                                 int& count) noexcept
 {
-    const double width = bez[N].x - bez[0].x;
-    int lastCrossing = -1;
-    const int n = CrossingCount<N>(bez, lastCrossing);
-    if (!(width > DBL_EPSILON)) {
-        if (n >= 1)
-            roots[count++] = bez[0].x;
-        return;
-    }
-    if (n == 0) {
-        if (bez[0].y == 0.0 && bez[1].y == 0.0)
-            roots[count++] = bez[0].x;
-        return;
-    }
-    const vector2d from = bez[lastCrossing];
-    const vector2d to = bez[lastCrossing + 1];
-    if (n == 1) {
-        const double start = from.x - (to.x - from.x) * (from.y / (to.y - from.y));
-        roots[count++] = FindSolutionNewtonsMethod_Guaranteed<N>(c, start, bez[0].x, bez[N].x, 1e-07);
-        return;
-    }
-    if (n == 2 && width < 2e-07) {
-        const Derivative<N> d(c);
-        double r = -1.0;
-        if (FindSolutionNewtonsMethod<N - 1>(d.c, (bez[0].x - bez[N].x) * 0.5, 1e-07, r) && std::fabs(Value<N>(c, r)) < 1e-07) {
-            roots[count++] = r;
-            return;
-        }
-    }
-    vector2d left[N + 1], right[N + 1];
-    left[0] = bez[0];
-    right[N] = bez[N];
-    if (n == 2)
-        SplitBezierT<N>::Split(bez + 1, (from.x - bez[0].x) / width, left, right);
-    else
-        SplitBezierT<N>::Split(bez + 1, left, right);
-    if (SameBits(left, bez, N + 1) || SameBits(right, bez, N + 1)) {
-        roots[count++] = bez[0].x;
-        return;
-    }
-    SolvePolynomial_BezierDivide_NewtonsMethod<N>(left, c, roots, count);
-    if (count > N - 1)
-        return;
-    SolvePolynomial_BezierDivide_NewtonsMethod<N>(right, c, roots, count);
+    count = Search<N>(c, roots, count).Run(bez);
 }
 
 template <>
 int FindRoots<2>(const double* c, double* roots, bool includeEndpoints) noexcept
 {
-    const auto inside = [includeEndpoints](double r) {
-        return includeEndpoints ? 0.0 <= r && r <= 1.0 : 0.0 < r && r < 1.0;
-    };
-    if (std::fabs(c[0]) <= 1e-09) {
-        if (c[1] == 0.0)
-            return 0;
-        roots[0] = -c[2] / c[1];
-        return inside(roots[0]) ? 1 : 0;
-    }
+    const UnitInterval interval{includeEndpoints};
+    if (std::fabs(c[0]) <= linearTolerance)
+        return c[1] == 0.0 ? 0 : interval.StoreSingle(-c[2] / c[1], roots);
     if (c[2] == 0.0) {
         const double r = -c[1] / c[0];
-        if (!includeEndpoints) {
-            roots[0] = r;
-            return inside(r) ? 1 : 0;
-        }
+        if (!includeEndpoints)
+            return interval.StoreSingle(r, roots);
         roots[0] = 0.0;
-        if (!inside(r))
+        if (!interval.Holds(r))
             return 1;
         roots[1] = r;
         return 2;
@@ -90,19 +208,16 @@ int FindRoots<2>(const double* c, double* roots, bool includeEndpoints) noexcept
     const double p = c[1] / c[0] * 0.5;
     const double q = c[2] / c[0];
     const double discriminant = p * p - q;
-    if (discriminant == 0.0) {
-        roots[0] = -p;
-        return inside(-p) ? 1 : 0;
-    }
+    if (discriminant == 0.0)
+        return interval.StoreSingle(-p, roots);
     if (discriminant < 0.0)
         return 0;
     const double s = std::sqrt(discriminant);
     int count = 0;
     for (const double r : {s - p, -s - p})
-        if (inside(r))
+        if (interval.Holds(r))
             roots[count++] = r;
-    if (count == 2 && roots[1] < roots[0])
-        std::swap(roots[0], roots[1]);
+    SortAscending(roots, count);
     return count;
 }
 
@@ -112,18 +227,8 @@ int FindRoots(const double* c, double* roots, bool includeEndpoints) noexcept
     if (c[0] == 0.0)
         return FindRoots<N - 1>(c + 1, roots, includeEndpoints);
     if (c[N] == 0.0) {
-        const int n = FindRoots<N - 1>(c, roots, includeEndpoints);
-        if (!includeEndpoints || c[N - 1] == 0.0)
-            return n;
-        if (n >= 1 && std::fabs(roots[0]) <= 1e-07) {
-            roots[0] = 0.0;
-            return n;
-        }
-        if (n >= 1 && n > N - 2)
-            return n;
-        roots[n] = 0.0;
-        std::stable_sort(roots, roots + n + 1);
-        return n + 1;
+        const int count = FindRoots<N - 1>(c, roots, includeEndpoints);
+        return includeEndpoints && c[N - 1] != 0.0 ? AddRootAtZero<N>(roots, count) : count;
     }
     vector2d bez[N + 1];
     PolynomialToBernsteinT<N, 0>::Convert(c, bez);
@@ -136,6 +241,26 @@ int FindRoots(const double* c, double* roots, bool includeEndpoints) noexcept
     return count;
 }
 
-#define INST(N) template void SolvePolynomial_BezierDivide_NewtonsMethod<N>(const vector2d*, const double*, double*, int&) noexcept; template int FindRoots<N>(const double*, double*, bool) noexcept;
-INST(3) INST(4) INST(5) INST(6) INST(7) INST(8) INST(9) INST(10) INST(11) INST(12)
+template void SolvePolynomial_BezierDivide_NewtonsMethod<3>(const vector2d*, const double*, double*, int&) noexcept;
+template void SolvePolynomial_BezierDivide_NewtonsMethod<4>(const vector2d*, const double*, double*, int&) noexcept;
+template void SolvePolynomial_BezierDivide_NewtonsMethod<5>(const vector2d*, const double*, double*, int&) noexcept;
+template void SolvePolynomial_BezierDivide_NewtonsMethod<6>(const vector2d*, const double*, double*, int&) noexcept;
+template void SolvePolynomial_BezierDivide_NewtonsMethod<7>(const vector2d*, const double*, double*, int&) noexcept;
+template void SolvePolynomial_BezierDivide_NewtonsMethod<8>(const vector2d*, const double*, double*, int&) noexcept;
+template void SolvePolynomial_BezierDivide_NewtonsMethod<9>(const vector2d*, const double*, double*, int&) noexcept;
+template void SolvePolynomial_BezierDivide_NewtonsMethod<10>(const vector2d*, const double*, double*, int&) noexcept;
+template void SolvePolynomial_BezierDivide_NewtonsMethod<11>(const vector2d*, const double*, double*, int&) noexcept;
+template void SolvePolynomial_BezierDivide_NewtonsMethod<12>(const vector2d*, const double*, double*, int&) noexcept;
+
+template int FindRoots<3>(const double*, double*, bool) noexcept;
+template int FindRoots<4>(const double*, double*, bool) noexcept;
+template int FindRoots<5>(const double*, double*, bool) noexcept;
+template int FindRoots<6>(const double*, double*, bool) noexcept;
+template int FindRoots<7>(const double*, double*, bool) noexcept;
+template int FindRoots<8>(const double*, double*, bool) noexcept;
+template int FindRoots<9>(const double*, double*, bool) noexcept;
+template int FindRoots<10>(const double*, double*, bool) noexcept;
+template int FindRoots<11>(const double*, double*, bool) noexcept;
+template int FindRoots<12>(const double*, double*, bool) noexcept;
+
 } // namespace ZarnMath::RootFinder

@@ -1,0 +1,46 @@
+/// @file
+/// Two doubles that one instruction works on side by side, each with its own rounding. Internal.
+///
+/// The vector extension is that of GCC and Clang; where a processor has no such registers it becomes two plain
+/// operations, with the same bits.
+#pragma once
+
+#include "ZarnMath/ValueTypes.h"
+
+#include <cstring>
+
+namespace ZarnMath {
+
+using Pair = double __attribute__((vector_size(16)));
+/// The result of a comparison of pairs: all ones or all zeros in each half.
+using PairMask = decltype(Pair{} < Pair{});
+
+[[nodiscard]] inline Pair Both(double v) noexcept
+{
+    return Pair{v, v};
+}
+
+[[nodiscard]] inline Pair LoadPair(const vector2d& v) noexcept
+{
+    Pair p;
+    std::memcpy(&p, &v, sizeof p);
+    return p;
+}
+
+/// In one piece, so that a `LoadPair` that follows need not wait for two halves.
+inline void StorePair(vector2d& v, Pair p) noexcept
+{
+    std::memcpy(&v, &p, sizeof p);
+}
+
+[[nodiscard]] inline Pair Absolute(Pair p) noexcept
+{
+    return p < Both(0.0) ? -p : p;
+}
+
+[[nodiscard]] inline bool IsAny(PairMask mask) noexcept
+{
+    return (mask[0] | mask[1]) != 0;
+}
+
+} // namespace ZarnMath

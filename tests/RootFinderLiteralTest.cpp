@@ -1,0 +1,249 @@
+#include "ZarnMath/RootFinder.h"
+#include "tests/LiteralRootFinder.h"
+
+#include <array>
+#include <cstdint>
+#include <cstring>
+#include <gtest/gtest.h>
+#include <random>
+#include <utility>
+
+// The library's root finder isolates first, polishes several roots side by side and works on both coordinates at once;
+// none of that may show in a single bit.
+
+namespace ZarnMath {
+namespace {
+
+template <int N>
+using Coefficients = std::array<double, N + 1>;
+
+/// Seeded polynomials of every kind that the steps of the root finder tell apart.
+template <int N>
+class Polynomials
+{
+public:
+    using Kind = Coefficients<N> (Polynomials::*)();
+
+    static constexpr std::array<std::pair<const char*, Kind>, 12> kinds = {{
+        {"random ordinates", &Polynomials::RandomOrdinates},
+        {"whole ordinates", &Polynomials::WholeOrdinates},
+        {"ordinates of any magnitude", &Polynomials::AnyMagnitude},
+        {"tiny ordinates", &Polynomials::TinyOrdinates},
+        {"zeros and products that underflow", &Polynomials::ZerosAndUnderflow},
+        {"a sign change at every leg", &Polynomials::EveryLegCrosses},
+        {"NaN and infinities", &Polynomials::NotFinite},
+        {"any bits at all", &Polynomials::AnyBits},
+        {"planted roots, on cuts and multiple", &Polynomials::PlantedRoots},
+        {"squares, all roots double", &Polynomials::Squares},
+        {"vanishing ends", &Polynomials::VanishingEnds},
+        {"close pairs of roots", &Polynomials::ClosePairs},
+    }};
+
+    Coefficients<N> RandomOrdinates()
+    {
+        return FromOrdinates([this] { return Uniform(); });
+    }
+
+    Coefficients<N> WholeOrdinates()
+    {
+        return FromOrdinates([this] { return std::round(4.0 * Uniform()); });
+    }
+
+    Coefficients<N> AnyMagnitude()
+    {
+        return FromOrdinates([this] { return Uniform() * std::pow(10.0, 300.0 * Uniform()); });
+    }
+
+    Coefficients<N> TinyOrdinates()
+    {
+        return FromOrdinates([this] { return 1e-16 * Uniform(); });
+    }
+
+    Coefficients<N> ZerosAndUnderflow()
+    {
+        constexpr std::array<double, 6> values = {0.0, -0.0, 1.0, -1.0, 1e-200, -1e-200};
+        return FromOrdinates([this, &values] { return values[Below(values.size())]; });
+    }
+
+    Coefficients<N> EveryLegCrosses()
+    {
+        double sign = 1.0;
+        return FromOrdinates([this, &sign] {
+            sign = -sign;
+            return sign * (1.0 + 0.1 * Uniform());
+        });
+    }
+
+    Coefficients<N> NotFinite()
+    {
+        constexpr std::array<double, 3> values = {HUGE_VAL, -HUGE_VAL, std::numeric_limits<double>::quiet_NaN()};
+        Coefficients<N> c = RandomOrdinates();
+        for (std::size_t i = 0; i <= Below(2); ++i)
+            c[Below(N + 1)] = values[Below(values.size())];
+        return c;
+    }
+
+    Coefficients<N> AnyBits()
+    {
+        Coefficients<N> c;
+        for (double& value : c) {
+            const std::uint64_t bits = engine();
+            std::memcpy(&value, &bits, sizeof value);
+        }
+        return c;
+    }
+
+    Coefficients<N> PlantedRoots()
+    {
+        double root = 0.0;
+        return FromRoots([this, &root] {
+            if (Below(3) != 0)
+                root = Below(4) == 0 ? static_cast<double>(Below(65)) / 64.0 : 0.5 + Uniform();
+            return root;
+        });
+    }
+
+    Coefficients<N> Squares()
+    {
+        std::array<double, N / 2 + 1> half;
+        for (double& value : half)
+            value = Uniform();
+        Coefficients<N> c{};
+        for (std::size_t i = 0; i < half.size(); ++i)
+            for (std::size_t j = 0; j < half.size(); ++j)
+                c[i + j + N % 2] += half[i] * half[j];
+        return c;
+    }
+
+    Coefficients<N> VanishingEnds()
+    {
+        Coefficients<N> c;
+        for (double& value : c)
+            value = std::round(10.0 * Uniform());
+        for (const std::size_t i : {std::size_t{0}, std::size_t{1}, std::size_t{N - 1}, std::size_t{N}})
+            if (Below(2) == 0)
+                c[i] = 0.0;
+        return c;
+    }
+
+    Coefficients<N> ClosePairs()
+    {
+        double root = 0.0;
+        bool second = true;
+        return FromRoots([this, &root, &second] {
+            second = !second;
+            root = second ? root + 1e-7 * Uniform() : 0.5 + 0.5 * Uniform();
+            return root;
+        });
+    }
+
+    bool Coin()
+    {
+        return Below(2) == 0;
+    }
+
+private:
+    double Uniform()
+    {
+        return static_cast<double>(engine() >> 11) * 0x1p-52 - 1.0;
+    }
+
+    std::size_t Below(std::size_t n)
+    {
+        return static_cast<std::size_t>(engine() % n);
+    }
+
+    template <typename Draw>
+    Coefficients<N> FromOrdinates(Draw draw)
+    {
+        std::array<double, N + 1> differences;
+        for (double& value : differences)
+            value = draw();
+        Coefficients<N> c;
+        for (std::size_t i = 0; i <= N; ++i) {
+            c[N - i] = Literal::binomials[N][i] * differences[0];
+            for (std::size_t j = 0; j + i < N; ++j)
+                differences[j] = differences[j + 1] - differences[j];
+        }
+        return c;
+    }
+
+    template <typename Draw>
+    Coefficients<N> FromRoots(Draw draw)
+    {
+        Coefficients<N> c{100.0};
+        for (std::size_t degree = 1; degree <= N; ++degree) {
+            const double root = draw();
+            for (std::size_t i = degree; i > 0; --i)
+                c[i] -= root * c[i - 1];
+        }
+        return c;
+    }
+
+    std::mt19937_64 engine{20240229 + N};
+};
+
+template <typename Degree>
+class RootFinderAgainstLiteral : public testing::Test
+{};
+
+template <int N>
+using Degree = std::integral_constant<int, N>;
+using Degrees = testing::Types<Degree<3>, Degree<4>, Degree<5>, Degree<6>, Degree<7>, Degree<8>, Degree<9>, Degree<10>,
+                               Degree<11>, Degree<12>>;
+TYPED_TEST_SUITE(RootFinderAgainstLiteral, Degrees);
+
+/// What no root is, so that a write beyond the count shows.
+template <int N>
+std::array<double, N + 3> Untouched()
+{
+    std::array<double, N + 3> values;
+    for (std::size_t i = 0; i < values.size(); ++i)
+        values[i] = -77.0 - static_cast<double>(i);
+    return values;
+}
+
+TYPED_TEST(RootFinderAgainstLiteral, GivesTheSameBits)
+{
+    constexpr int N = TypeParam::value;
+    constexpr int casesOfAKind = 900; // 108,000 polynomials over all kinds and degrees
+    Polynomials<N> polynomials;
+    for (const auto& [name, kind] : Polynomials<N>::kinds) {
+        for (int i = 0; i < casesOfAKind; ++i) {
+            const Coefficients<N> c = (polynomials.*kind)();
+            const bool includeEndpoints = polynomials.Coin();
+            auto expected = Untouched<N>();
+            auto actual = expected;
+            const int expectedCount = Literal::FindRoots<N>(c.data(), expected.data(), includeEndpoints);
+            const int count = RootFinder::FindRoots<N>(c.data(), actual.data(), includeEndpoints);
+            ASSERT_EQ(count, expectedCount) << name << ", case " << i;
+            for (std::size_t k = 0; k < expected.size(); ++k)
+                ASSERT_TRUE(Literal::HasSameBits(actual[k], expected[k]))
+                    << name << ", case " << i << ", element " << k << ": " << actual[k] << " for " << expected[k];
+        }
+    }
+}
+
+TYPED_TEST(RootFinderAgainstLiteral, ContinuesAnArrayThatHoldsRootsAlready)
+{
+    constexpr int N = TypeParam::value;
+    Polynomials<N> polynomials;
+    for (int i = 0; i < 2000; ++i) {
+        const Coefficients<N> c = polynomials.RandomOrdinates();
+        vector2d bez[N + 1];
+        Literal::ToBernstein<N>(c.data(), bez);
+        const int before = i % (N + 2);
+        std::array<double, 2 * N + 4> expected;
+        expected.fill(-77.0);
+        auto actual = expected;
+        int expectedCount = before;
+        int count = before;
+        Literal::Solve<N>(bez, c.data(), expected.data(), expectedCount);
+        RootFinder::SolvePolynomial_BezierDivide_NewtonsMethod<N>(bez, c.data(), actual.data(), count);
+        ASSERT_EQ(count, expectedCount);
+        ASSERT_EQ(actual, expected);
+    }
+}
+
+} // namespace
+} // namespace ZarnMath
