@@ -13,9 +13,9 @@ namespace ZarnMath {
 /// Fits a line to points.
 ///
 /// The result has one of two forms:
-/// - where the mixed moment of the points vanishes exactly, `point` is the centroid and `direction` is (1, 0) or (0, 1),
-///   along the longer side of their box, and (0, 1) for a square one. So it is for coincident points, and for horizontal
-///   and vertical lines of whole coordinates;
+/// - where the mixed moment of the points comes out as exactly 0, `point` is the centroid and `direction` is (1, 0) or
+///   (0, 1), along the longer side of their box, and (0, 1) for a square one. So it is for coincident points, and for
+///   horizontal and vertical lines as far as no sum is rounded;
 /// - otherwise the line is x = point.x + direction.x * y: `point` is its crossing with y = 0, not the centroid, and
 ///   `direction` is (direction.x, 1), not of unit length. A line that is nearly horizontal gives a huge direction.x.
 ///

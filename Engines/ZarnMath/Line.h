@@ -15,8 +15,8 @@ namespace ZarnMath {
 /// @param count     their number; up to two points are always collinear
 /// @param tolerance the largest *squared* distance from the line that passes, itself included. A negative one fails even
 ///                  points on the line. The `POINT` overload compares in double
-/// @return whether no point is farther away. Points that are exactly horizontal but not whole can fail: rounding then
-///         leaves the fit with a mixed moment that is not zero, and so with a huge direction
+/// @return whether no point is farther away. Horizontal points can fail where a sum is rounded: the fit then has a mixed
+///         moment that is not quite zero, and so a huge direction
 [[nodiscard]] ZARNMATH_API bool AreCollinear(const point2d* points, unsigned long count, double tolerance) noexcept;
 [[nodiscard]] ZARNMATH_API bool AreCollinear(const POINT* points, unsigned long count, double tolerance);
 

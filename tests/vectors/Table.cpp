@@ -33,8 +33,10 @@ Table MakeTable()
 {
     Table table;
     AddBezierToLinesAdapters(table);
+    AddBoundsAdapters(table);
     AddClosestPointAdapters(table);
     AddCuttingAdapters(table);
+    AddLineAdapters(table);
     AddPlatformAdapters(table);
     AddRootFinderAdapters(table);
     AddValueTypesAdapters(table);

@@ -54,8 +54,10 @@ Table MakeTable();
 /// @name One function a unit, in <Unit>Adapters.cpp
 /// @{
 void AddBezierToLinesAdapters(Table& table);
+void AddBoundsAdapters(Table& table);
 void AddClosestPointAdapters(Table& table);
 void AddCuttingAdapters(Table& table);
+void AddLineAdapters(Table& table);
 void AddPlatformAdapters(Table& table);
 void AddRootFinderAdapters(Table& table);
 void AddValueTypesAdapters(Table& table);
