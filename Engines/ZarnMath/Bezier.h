@@ -216,5 +216,65 @@ ZARNMATH_API int FindTangentsToPoint(const point2d& a, const point2d& b, const p
                                      const point2d& q, double* parameters) noexcept;
 
 /// @}
+/// @name Implicit form
+/// @{
+
+/// The cubic polynomial of x and y that vanishes on the curve, by the Bezout resultant with respect to t (Sederberg,
+/// 1983):
+///
+/// f(x, y) = Kxxx*x^3 + Kyyy*y^3 + Kxxy*x^2*y + Kxyy*x*y^2 + Kxx*x^2 + Kyy*y^2 + Kxy*x*y + Kx*x + Ky*y + K1
+///
+/// f(P(t)) = 0 for all real t, outside [0, 1] too. f is the determinant itself, whose sign tells the two sides of the
+/// curve apart. It is the zero polynomial where a = (0, 0), for a parabola therefore, and the negative cube of a line's
+/// equation where a, b and c are parallel.
+///
+/// @param a, b, c, d power form
+/// @param[out] Kxxx, Kyyy, Kxxy, Kxyy, Kxx, Kyy, Kxy, Kx, Ky, K1 the coefficients, both pure cubes first
+ZARNMATH_API void ConvertBezierToImplicit(const point2d& a, const point2d& b, const point2d& c, const point2d& d,
+                                          double& Kxxx, double& Kyyy, double& Kxxy, double& Kxyy, double& Kxx,
+                                          double& Kyy, double& Kxy, double& Kx, double& Ky, double& K1) noexcept;
+
+/// @}
+/// @name Lines
+/// The curve substituted into the line's equation, a cubic in t. A curve that lies along the line crosses it nowhere.
+/// @{
+
+/// The points at which a cubic crosses the infinite line through two points.
+///
+/// @param bezier                four control points
+/// @param line                  two points, at which the line's parameter is 0 and 1
+/// @param[out] bezierParameters parameters on the curve, at most four, in the root finder's order
+/// @param[out] lineParameters   parameters along the line, element for element; any real number
+/// @param includeEndpoints      whether t = 0 and t = 1 of the curve count. Even then t = 0 is dropped where the curve
+///                              crosses twice besides
+/// @return whether anything was found. Both vectors are cleared first, and stay empty where the two points of the line are
+///         exactly equal.
+ZARNMATH_API bool FindBezierLineIntersection(const point2d* bezier, const point2d* line,
+                                             std::vector<double>& bezierParameters, std::vector<double>& lineParameters,
+                                             bool includeEndpoints);
+ZARNMATH_API bool FindBezierLineIntersection(const POINT* bezier, const POINT* line,
+                                             std::vector<double>& bezierParameters, std::vector<double>& lineParameters,
+                                             bool includeEndpoints);
+
+/// The parameters at which a cubic has a given x.
+///
+/// @param bezier             four control points
+/// @param x                  where the vertical line stands
+/// @param[in,out] parameters the parameters are appended, at most four, in the root finder's order
+/// @param includeEndpoints   whether t = 0 and t = 1 count
+/// @return whether `parameters` is not empty afterwards: true as well where it was not empty before
+ZARNMATH_API bool FindBezierIntersectionsAtX(const point2d* bezier, double x, std::vector<double>& parameters,
+                                             bool includeEndpoints);
+
+/// Whether a cubic crosses a segment. An end of the segment on the curve counts, an end of the curve on the segment does
+/// not.
+///
+/// @param bezier four control points
+/// @param line   the two ends of the segment
+/// @return whether there is a crossing with t in (0, 1) and u in [0, 1]; false for a segment without length
+[[nodiscard]] ZARNMATH_API bool DoesBezierIntersectLineSegment(const point2d* bezier, const point2d* line) noexcept;
+[[nodiscard]] ZARNMATH_API bool DoesBezierIntersectLineSegment(const POINT* bezier, const POINT* line) noexcept;
+
+/// @}
 
 } // namespace ZarnMath::CubicBezier

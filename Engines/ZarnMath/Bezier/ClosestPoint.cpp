@@ -1,3 +1,4 @@
+#include "ZarnMath/Bezier/Polynomial.h"
 #include "ZarnMath/Bezier/PowerForm.h"
 #include "ZarnMath/BezierInternal.h"
 #include "ZarnMath/RootFinder.h"
@@ -5,13 +6,6 @@
 namespace ZarnMath::CubicBezier {
 
 namespace {
-
-/// A polynomial of degree N, highest power first.
-template <int N>
-struct Polynomial
-{
-    double c[N + 1];
-};
 
 /// Half the derivative of |P(t) - q|^2, Dot(P(t) - q, P'(t)).
 Polynomial<5> DistancePolynomial(const PowerForm& f, const point2d& q) noexcept
