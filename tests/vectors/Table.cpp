@@ -36,9 +36,11 @@ Table MakeTable()
     AddBoundsAdapters(table);
     AddClosestPointAdapters(table);
     AddCuttingAdapters(table);
+    AddIntersectionAdapters(table);
     AddLineAdapters(table);
     AddPlatformAdapters(table);
     AddRootFinderAdapters(table);
+    AddSelfIntersectionAdapters(table);
     AddValueTypesAdapters(table);
     return table;
 }

@@ -57,9 +57,11 @@ void AddBezierToLinesAdapters(Table& table);
 void AddBoundsAdapters(Table& table);
 void AddClosestPointAdapters(Table& table);
 void AddCuttingAdapters(Table& table);
+void AddIntersectionAdapters(Table& table);
 void AddLineAdapters(Table& table);
 void AddPlatformAdapters(Table& table);
 void AddRootFinderAdapters(Table& table);
+void AddSelfIntersectionAdapters(Table& table);
 void AddValueTypesAdapters(Table& table);
 /// @}
 
