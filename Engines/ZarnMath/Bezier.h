@@ -243,8 +243,8 @@ ZARNMATH_API void ConvertBezierToImplicit(const point2d& a, const point2d& b, co
 /// One of the curves is made implicit and the other substituted, which leaves a polynomial of degree 9 in the parameter
 /// of the second (Sederberg and Parry, 1986). Each root in (0, 1) is kept where the point lies within 0.1 units of the
 /// first curve's segment. Before that, a curve whose control points lie within 2 units of a straight line is taken for
-/// its chord, the first one before the second; crossings are then accepted within 2 units of the curve. These lengths are
-/// absolute: a curve of a few units always counts as straight.
+/// its chord, the first one before the second; crossings are then accepted within 2 units of the curve. These lengths
+/// are absolute: a curve of a few units always counts as straight.
 ///
 /// Nothing is found where the curves
 /// - share an end point only, since the range of the parameters is open;
@@ -279,8 +279,8 @@ ZARNMATH_API void FindBezierIntersections(const POINT* first, const POINT* secon
 /// @param[out] lineParameters   parameters along the line, element for element; any real number
 /// @param includeEndpoints      whether t = 0 and t = 1 of the curve count. Even then t = 0 is dropped where the curve
 ///                              crosses twice besides
-/// @return whether anything was found. Both vectors are cleared first, and stay empty where the two points of the line are
-///         exactly equal.
+/// @return whether anything was found. Both vectors are cleared first, and stay empty where the two points of the line
+///         are exactly equal.
 ZARNMATH_API bool FindBezierLineIntersection(const point2d* bezier, const point2d* line,
                                              std::vector<double>& bezierParameters, std::vector<double>& lineParameters,
                                              bool includeEndpoints);
@@ -298,8 +298,8 @@ ZARNMATH_API bool FindBezierLineIntersection(const POINT* bezier, const POINT* l
 ZARNMATH_API bool FindBezierIntersectionsAtX(const point2d* bezier, double x, std::vector<double>& parameters,
                                              bool includeEndpoints);
 
-/// Whether a cubic crosses a segment. An end of the segment on the curve counts, an end of the curve on the segment does
-/// not.
+/// Whether a cubic crosses a segment. An end of the segment on the curve counts, an end of the curve on the segment
+/// does not.
 ///
 /// @param bezier four control points
 /// @param line   the two ends of the segment
@@ -313,9 +313,9 @@ ZARNMATH_API bool FindBezierIntersectionsAtX(const point2d* bezier, double x, st
 
 /// Whether a cubic has a loop, in closed form, and about where it crosses itself.
 ///
-/// A loop is what a cubic has without real inflections. The two passes of the crossing are bracketed by tangency: the
-/// later pass by the parameters at which the tangent runs through P0, the earlier one by those of P3 on the reversed
-/// curve.
+/// A cubic without real inflections has a loop somewhere (Stone and DeRose, 1989). The two passes of the crossing are
+/// bracketed by tangency: the later pass by the parameters at which the tangent runs through P0, the earlier one by
+/// those of P3 on the reversed curve.
 ///
 /// @param bezier                      four control points
 /// @param[out] lateStart, lateEnd     the stretch of the later pass, ascending, within [0, 1]
@@ -329,16 +329,16 @@ ZARNMATH_API bool DoesBezierSelfIntersect(const POINT* bezier, double& lateStart
 
 /// The point at which a cubic crosses itself.
 ///
-/// The two stretches of `DoesBezierSelfIntersect` are halved against each other. Stretches below one unit are given up, so
-/// that a small loop, such as (0, 0), (30, 30), (-10, 30), (20, 0), is not found.
+/// The two stretches of `DoesBezierSelfIntersect` are halved against each other. Stretches below one unit are given up,
+/// so that a small loop, such as (0, 0), (30, 30), (-10, 30), (20, 0), is not found.
 ///
 /// @param bezier      four control points
 /// @param[out] first  parameter of the later pass
 /// @param[out] second parameter of the earlier pass
 /// @param[out] point  the crossing
-/// @return whether it was found. If not, the results may have been written, and mean nothing. Where one of the stretches
-///         is a point, the crossing is at an end of the curve, and first is the smaller parameter: 0 and 1 for a closed
-///         curve.
+/// @return whether it was found. If not, the results may have been written, and mean nothing. Where one of the
+///         stretches is a point, the crossing is at an end of the curve, and first is the smaller parameter: 0 and 1
+///         for a closed curve.
 ZARNMATH_API bool FindBezierSelfIntersection(const point2d* bezier, double& first, double& second,
                                              point2d& point) noexcept;
 ZARNMATH_API bool FindBezierSelfIntersection(const POINT* bezier, double& first, double& second,

@@ -44,7 +44,8 @@ void GetBezierIntersectionPolynomial(const point2d& a1, const point2d& b1, const
                                      const point2d& a2, const point2d& b2, const point2d& c2, const point2d& d2,
                                      double* polynomial) noexcept;
 
-/// The algebraic stage of the exported `FindBezierIntersections`, on power forms, of which neither is taken as straight.
+/// The algebraic stage of the exported `FindBezierIntersections`, on power forms, of which neither is taken as
+/// straight.
 ///
 /// The three vectors are cleared. Where the first curve has no cubic term at all, the second is the one made implicit;
 /// where neither has one, nothing is found.
@@ -87,8 +88,8 @@ inline constexpr int maxIntersections = 9;
 /// The crossings of two cubics by halving both down to a fixed depth, where their chords are taken for them (Lane and
 /// Riesenfeld, 1980). It serves the search of a curve against itself.
 ///
-/// A pair is given up where either half is below one unit in both directions, so that only curves of more than about 2^7
-/// units are searched to the end. Crossings come depth first, the left halves before the right ones, and are not
+/// A pair is given up where either half is below one unit in both directions, so that only curves of more than about
+/// 2^7 units are searched to the end. Crossings come depth first, the left halves before the right ones, and are not
 /// made unique.
 ///
 /// @param first                   four control points

@@ -84,13 +84,13 @@ public:
 private:
     point2d Point()
     {
-        const double x = coefficient_(engine_);
-        const double y = coefficient_(engine_);
+        const double x = coefficient(engine);
+        const double y = coefficient(engine);
         return {x, y};
     }
 
-    std::mt19937 engine_{20261120};
-    std::uniform_int_distribution<int> coefficient_{-6, 6};
+    std::mt19937 engine{20261120};
+    std::uniform_int_distribution<int> coefficient{-6, 6};
 };
 
 TEST(ImplicitForm, IsTheSemicubicalParabola)

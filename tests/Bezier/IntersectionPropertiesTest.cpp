@@ -138,8 +138,8 @@ double SineBetween(const Cubic& first, double s, const Cubic& second, double t)
     return std::fabs(Cross(u, v)) / std::sqrt(LengthSquared(u) * LengthSquared(v));
 }
 
-/// A straight curve that ends where it starts has no chord to stand for it. Made implicit, it is the cube of a line, whose
-/// triple roots do not all show; substituted, it passes each crossing at two parameters.
+/// A straight curve that ends where it starts has no chord to stand for it. Made implicit, it is the cube of a line,
+/// whose triple roots do not all show; substituted, it passes each crossing at two parameters.
 TEST(IntersectionProperties, DoesNotDependOnWhichCurveIsFirst)
 {
     RandomSource random(seed);

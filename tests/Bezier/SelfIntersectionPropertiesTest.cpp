@@ -1,5 +1,5 @@
-// What holds of every crossing of a curve with itself, on thousands of curves of all shapes and sizes. Where a known loss
-// breaks a rule, the loss is named, counted, and kept rare.
+// What holds of every crossing of a curve with itself, on thousands of curves of all shapes and sizes. Where a known
+// loss breaks a rule, the loss is named, counted, and kept rare.
 #include "ZarnMath/Bezier.h"
 
 #include "tests/Bezier/CurveMeasures.h"

@@ -212,6 +212,23 @@ TEST(SelfIntersection, DoesNotOccurOnDegenerateCurves)
     }
 }
 
+TEST(SelfIntersection, IsRejectedWhereTheReversedCurveAloneRoundsToStraight)
+{
+    // All but straight, so that rounding makes the two cross products unlike: one is 0 and the other is not.
+    constexpr Cubic flat{{{-0x1.57767d18d27b4p-2, 0x1.1c3171c8a9fp-8},
+                          {-0x1.a5ed9033edafep-3, -0x1.5d467c5d4f918p-11},
+                          {-0x1.d058bf0bafd6ep-3, 0x1.1a4208a4522ap-13},
+                          {-0x1.42495561ef36p-3, -0x1.4ddeaed629732p-9}}};
+    const PowerForm f = ToPowerForm(flat.data());
+    const Cubic reversed = {flat[3], flat[2], flat[1], flat[0]};
+    const PowerForm g = ToPowerForm(reversed.data());
+    ASSERT_NE(Cross(f.a, f.b), 0.0);
+    ASSERT_EQ(Cross(point2d{-f.a.x, -f.a.y}, g.b), 0.0);
+    const Bounds b(flat);
+    EXPECT_FALSE(b.result);
+    EXPECT_TRUE(b.AreUntouched());
+}
+
 /// A piece of the loop, which crosses itself at about 0.17 and 0.83 of the whole.
 Cubic PieceOfLoop(double t0, double t1)
 {

@@ -171,7 +171,8 @@ double FindNearest(const Cubic& curve, const point2d& q)
         else
             low += third;
     }
-    // Where the curve starts or ends with no speed, the distance is too flat to tell its end from the parameters beside.
+    // Where the curve starts or ends with no speed, the distance is too flat to tell its end from the parameters
+    // beside.
     const double inside = (low + high) * 0.5;
     const double nearly = std::sqrt(distance(inside)) + 1e-9 * SizeOf(curve);
     for (const double end : {0.0, 1.0})

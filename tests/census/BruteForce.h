@@ -26,12 +26,12 @@ struct Contact
 /// @return nothing where the curves run together along a stretch
 std::optional<std::vector<Contact>> FindContacts(const Cubic& first, const Cubic& second);
 
-/// The zeros of a function on [0, 1]: changes of sign between many samples, each narrowed by bisection, and the two ends
-/// where it is below the tolerance.
+/// The zeros of a function on [0, 1]: changes of sign between many samples, each narrowed by bisection, and the two
+/// ends where it is below the tolerance.
 std::vector<double> FindZeros(const std::function<double(double)>& f, double tolerance);
 
-/// The parameter in [0, 1] of the nearest point of a curve: the best of many samples, narrowed by ternary search; exactly
-/// 0 or 1 where that end is as near.
+/// The parameter in [0, 1] of the nearest point of a curve: the best of many samples, narrowed by ternary search;
+/// exactly 0 or 1 where that end is as near.
 double FindNearest(const Cubic& curve, const point2d& q);
 
 } // namespace ZarnMath::Census

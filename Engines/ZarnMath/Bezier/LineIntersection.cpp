@@ -7,27 +7,28 @@ namespace ZarnMath::CubicBezier {
 
 namespace {
 
-/// The coordinate of a point along a line, 0 at line[0] and 1 at line[1], read off the line's dominant axis.
+/// The coordinate of a point along a line, 0 at line[0] and 1 at line[1], read off the line's dominant axis. The
+/// reciprocal of its extent is taken once, for all points.
 class LineScale
 {
 public:
     explicit LineScale(const point2d* line) noexcept
     {
         const vector2d along = line[1] - line[0];
-        axis_ = std::fabs(along.x) > std::fabs(along.y) ? &point2d::x : &point2d::y;
-        origin_ = line[0].*axis_;
-        inverse_ = 1.0 / (line[1].*axis_ - origin_);
+        axis = std::fabs(along.x) > std::fabs(along.y) ? &point2d::x : &point2d::y;
+        origin = line[0].*axis;
+        inverse = 1.0 / (line[1].*axis - origin);
     }
 
     double operator()(const point2d& p) const noexcept
     {
-        return inverse_ * (p.*axis_ - origin_);
+        return inverse * (p.*axis - origin);
     }
 
 private:
-    double point2d::*axis_;
-    double origin_;
-    double inverse_;
+    double point2d::*axis;
+    double origin;
+    double inverse;
 };
 
 } // namespace
