@@ -403,6 +403,153 @@ ZARNMATH_API int FindTangentsToPoint(const point2d& a, const point2d& b, const p
                                      const point2d& q, double* parameters) noexcept;
 
 /// @}
+/// @name Implicit form
+/// @{
+
+/// The cubic polynomial of x and y that vanishes on the curve, by the Bezout resultant with respect to t (Sederberg,
+/// 1983):
+///
+/// f(x, y) = Kxxx*x^3 + Kyyy*y^3 + Kxxy*x^2*y + Kxyy*x*y^2 + Kxx*x^2 + Kyy*y^2 + Kxy*x*y + Kx*x + Ky*y + K1
+///
+/// f(P(t)) = 0 for all real t, outside [0, 1] too. f is the determinant itself, whose sign tells the two sides of the
+/// curve apart. It is the zero polynomial where a = (0, 0), for a parabola therefore, and the negative cube of a line's
+/// equation where a, b and c are parallel.
+///
+/// @param a, b, c, d power form
+/// @param[out] Kxxx, Kyyy, Kxxy, Kxyy, Kxx, Kyy, Kxy, Kx, Ky, K1 the coefficients, both pure cubes first
+ZARNMATH_API void ConvertBezierToImplicit(const point2d& a, const point2d& b, const point2d& c, const point2d& d,
+                                          double& Kxxx, double& Kyyy, double& Kxxy, double& Kxyy, double& Kxx,
+                                          double& Kyy, double& Kxy, double& Kx, double& Ky, double& K1) noexcept;
+
+/// @}
+/// @name Intersection
+/// @{
+
+/// The points at which two cubics cross.
+///
+/// One of the curves is made implicit and the other substituted, which leaves a polynomial of degree 9 in the parameter
+/// of the second (Sederberg and Parry, 1986). Each root in (0, 1) is kept where the point lies within 0.1 units of the
+/// first curve's segment. Before that, a curve whose control points lie within 2 units of a straight line is taken for
+/// its chord, the first one before the second; crossings are then accepted within 2 units of the curve. These lengths
+/// are absolute: a curve of a few units always counts as straight.
+///
+/// Nothing is found where the curves
+/// - share an end point only, since the range of the parameters is open;
+/// - touch without crossing;
+/// - overlap, and lie on one algebraic curve or on one line;
+/// - both have no cubic term (a = (0, 0)), as two parabolas.
+///
+/// @param first, second            four control points each
+/// @param[in,out] firstParameters  parameters on the first curve
+/// @param[in,out] secondParameters parameters on the second curve
+/// @param[in,out] points           the points, on the curve that was substituted
+///
+/// The three vectors are parallel and hold at most nine crossings more than before, in the root finder's order, neither
+/// sorted nor made unique. Pass empty ones: crossings with a straight curve are appended, all others replace what the
+/// vectors held.
+ZARNMATH_API void FindBezierIntersections(const point2d* first, const point2d* second,
+                                          std::vector<double>& firstParameters, std::vector<double>& secondParameters,
+                                          std::vector<point2d>& points);
+ZARNMATH_API void FindBezierIntersections(const POINT* first, const POINT* second, std::vector<double>& firstParameters,
+                                          std::vector<double>& secondParameters, std::vector<point2d>& points);
+
+/// @}
+/// @name Lines
+/// The curve substituted into the line's equation, a cubic in t. A curve that lies along the line crosses it nowhere.
+/// @{
+
+/// The points at which a cubic crosses the infinite line through two points.
+///
+/// @param bezier                four control points
+/// @param line                  two points, at which the line's parameter is 0 and 1
+/// @param[out] bezierParameters parameters on the curve, at most four, in the root finder's order
+/// @param[out] lineParameters   parameters along the line, element for element; any real number
+/// @param includeEndpoints      whether t = 0 and t = 1 of the curve count. Even then t = 0 is dropped where the curve
+///                              crosses twice besides
+/// @return whether anything was found. Both vectors are cleared first, and stay empty where the two points of the line
+///         are exactly equal.
+ZARNMATH_API bool FindBezierLineIntersection(const point2d* bezier, const point2d* line,
+                                             std::vector<double>& bezierParameters, std::vector<double>& lineParameters,
+                                             bool includeEndpoints);
+ZARNMATH_API bool FindBezierLineIntersection(const POINT* bezier, const POINT* line,
+                                             std::vector<double>& bezierParameters, std::vector<double>& lineParameters,
+                                             bool includeEndpoints);
+
+/// The parameters at which a cubic has a given x.
+///
+/// @param bezier             four control points
+/// @param x                  where the vertical line stands
+/// @param[in,out] parameters the parameters are appended, at most four, in the root finder's order
+/// @param includeEndpoints   whether t = 0 and t = 1 count
+/// @return whether `parameters` is not empty afterwards: true as well where it was not empty before
+ZARNMATH_API bool FindBezierIntersectionsAtX(const point2d* bezier, double x, std::vector<double>& parameters,
+                                             bool includeEndpoints);
+
+/// Whether a cubic crosses a segment. An end of the segment on the curve counts, an end of the curve on the segment
+/// does not.
+///
+/// @param bezier four control points
+/// @param line   the two ends of the segment
+/// @return whether there is a crossing with t in (0, 1) and u in [0, 1]; false for a segment without length
+[[nodiscard]] ZARNMATH_API bool DoesBezierIntersectLineSegment(const point2d* bezier, const point2d* line) noexcept;
+[[nodiscard]] ZARNMATH_API bool DoesBezierIntersectLineSegment(const POINT* bezier, const POINT* line) noexcept;
+
+/// @}
+/// @name Self-intersection and fast predicates
+/// @{
+
+/// Whether a cubic has a loop, in closed form, and about where it crosses itself.
+///
+/// A cubic without real inflections has a loop somewhere (Stone and DeRose, 1989). The two passes of the crossing are
+/// bracketed by tangency: the later pass by the parameters at which the tangent runs through P0, the earlier one by
+/// those of P3 on the reversed curve.
+///
+/// @param bezier                      four control points
+/// @param[out] lateStart, lateEnd     the stretch of the later pass, ascending, within [0, 1]
+/// @param[out] earlyStart, earlyEnd   the stretch of the earlier pass, likewise
+/// @param allowClosed                 whether a curve whose ends coincide counts as crossing itself there
+/// @return whether the curve crosses itself. If not, the four results may have been written, or not, and mean nothing.
+ZARNMATH_API bool DoesBezierSelfIntersect(const point2d* bezier, double& lateStart, double& lateEnd, double& earlyStart,
+                                          double& earlyEnd, bool allowClosed) noexcept;
+ZARNMATH_API bool DoesBezierSelfIntersect(const POINT* bezier, double& lateStart, double& lateEnd, double& earlyStart,
+                                          double& earlyEnd, bool allowClosed) noexcept;
+
+/// The point at which a cubic crosses itself.
+///
+/// The two stretches of `DoesBezierSelfIntersect` are halved against each other. Stretches below one unit are given up,
+/// so that a small loop, such as (0, 0), (30, 30), (-10, 30), (20, 0), is not found.
+///
+/// @param bezier      four control points
+/// @param[out] first  parameter of the later pass
+/// @param[out] second parameter of the earlier pass
+/// @param[out] point  the crossing
+/// @return whether it was found. If not, the results may have been written, and mean nothing. Where one of the
+///         stretches is a point, the crossing is at an end of the curve, and first is the smaller parameter: 0 and 1
+///         for a closed curve.
+ZARNMATH_API bool FindBezierSelfIntersection(const point2d* bezier, double& first, double& second,
+                                             point2d& point) noexcept;
+ZARNMATH_API bool FindBezierSelfIntersection(const POINT* bezier, double& first, double& second,
+                                             point2d& point) noexcept;
+
+/// Whether two cubics meet: share an end point exactly, or cross as `FindBezierIntersections` sees it.
+///
+/// @param one, other four control points each
+[[nodiscard]] ZARNMATH_API bool DoBeziersIntersect(const point2d* one, const point2d* other);
+[[nodiscard]] ZARNMATH_API bool DoBeziersIntersect(const POINT* one, const POINT* other);
+
+/// Whether a cubic comes within a distance of a segment, strictly, by cheap tests first.
+///
+/// One end of the segment has to lie in the box of the control points grown by the distance: a segment that runs right
+/// through the curve with both ends outside gets false. The closest approach to the interior of the segment is not
+/// sought, only that of the two ends of the curve, and the crossing itself.
+///
+/// @param bezier             four control points
+/// @param lineStart, lineEnd the segment, which may be without length
+/// @param halfWidth          the distance
+[[nodiscard]] ZARNMATH_API bool DoesFatlineIntersectBezier(const point2d* bezier, const point2d& lineStart,
+                                                           const point2d& lineEnd, double halfWidth) noexcept;
+
+/// @}
 /// @name Directions and extents
 /// Where the tangent has a given direction, as the roots of a quadratic: its leading coefficient counts as zero up to
 /// 1e-9, so that a root far outside the segment, and on tiny curves one inside it, is lost.

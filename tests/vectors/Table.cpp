@@ -39,9 +39,11 @@ Table MakeTable()
     AddCuttingAdapters(table);
     AddExtentsAdapters(table);
     AddLengthAdapters(table);
+    AddIntersectionAdapters(table);
     AddLineAdapters(table);
     AddPlatformAdapters(table);
     AddRootFinderAdapters(table);
+    AddSelfIntersectionAdapters(table);
     AddValueTypesAdapters(table);
     return table;
 }

@@ -71,9 +71,11 @@ void AddCurvatureAdapters(Table& table);
 void AddCuttingAdapters(Table& table);
 void AddExtentsAdapters(Table& table);
 void AddLengthAdapters(Table& table);
+void AddIntersectionAdapters(Table& table);
 void AddLineAdapters(Table& table);
 void AddPlatformAdapters(Table& table);
 void AddRootFinderAdapters(Table& table);
+void AddSelfIntersectionAdapters(Table& table);
 void AddValueTypesAdapters(Table& table);
 /// @}
 
