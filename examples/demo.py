@@ -41,6 +41,18 @@ def scenes(fonts):
                ["closest", *drawing(name), "--to", to])
     yield ("flatten nautilus.svg, whole units", "A drawing 2000 units wide, in integers: vertices are rounded.",
            ["flatten", *drawing("nautilus.svg"), "--tolerance", "2", "--units", "2000", "--integer"])
+    for name, distance, to in (("nautilus.svg", "2500", "90000,-4000"), ("rose-window.svg", "3500", "-6000,50000")):
+        yield (f"curvature {name}", "The comb: a tooth is as long as the curve bends. Dots where the speed is extreme.",
+               ["curvature", *drawing(name)])
+        yield (f"length {name}", "Rulers: ticks at equal lengths along each contour.",
+               ["length", *drawing(name), "--spacing", "1000"])
+        yield (f"bounds {name}", "The tight box of each curve, of each contour and of all.", ["bounds", *drawing(name)])
+        yield (f"intersect {name}", "Every place where two curves cross, or one crosses itself.",
+               ["intersect", *drawing(name)])
+        yield (f"tangents {name}", "All tangents through a point.", ["tangents", *drawing(name), "--to", to])
+        yield (f"area {name}", "Which way each contour runs, and what it encloses.", ["area", *drawing(name)])
+        yield (f"cusps {name}", "Offset curves, and where they turn back.",
+               ["cusps", *drawing(name), "--distance", distance])
     for font in fonts:
         family = os.path.splitext(os.path.basename(font))[0]
         yield (f"flatten a line of text, {family}", "Outlines of a font; quadratics are raised to cubics.",
@@ -49,6 +61,20 @@ def scenes(fonts):
                ["split", *text("Ampersand &", font), "--at", "0.5"])
         yield (f"closest in a line of text, {family}", "A point beside the letters and the nearest point on them.",
                ["closest", *text("Ampersand &", font), "--to", "53000,16500"])
+        yield (f"curvature of letters, {family}", "How letters bend: flat, round, and back at the inflections.",
+               ["curvature", *text("Rag&", font)])
+        yield (f"length of letters, {family}", "Points at equal lengths, from curve to curve.",
+               ["length", *text("Rag&", font), "--spacing", "1000"])
+        yield (f"bounds of letters, {family}", "Boxes, and the places where a coordinate is extreme.",
+               ["bounds", *text("Rag&", font)])
+        yield (f"intersect a line of text, {family}", "Outlines that overlap cross each other.",
+               ["intersect", *text("Ampersand &", font)])
+        yield (f"tangents to letters, {family}", "All tangents through a point below the line.",
+               ["tangents", *text("Rag&", font), "--to", "50000,-12000"])
+        yield (f"area of letters, {family}", "Counters run the other way round: their area is subtracted.",
+               ["area", *text("Rag&", font)])
+        yield (f"cusps in letters, {family}", "Letters made bolder: where the offset turns back.",
+               ["cusps", *text("Rag&", font), "--distance", "900"])
 
 
 def run(curvelab, folder, number, scene):

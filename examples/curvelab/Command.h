@@ -51,14 +51,22 @@ struct Command
     Question (*prepare)(const Arguments& arguments);
 };
 
+[[nodiscard]] Command AreaCommand();
+[[nodiscard]] Command BoundsCommand();
 [[nodiscard]] Command ClosestCommand();
+[[nodiscard]] Command CurvatureCommand();
+[[nodiscard]] Command CuspsCommand();
 [[nodiscard]] Command FlattenCommand();
+[[nodiscard]] Command IntersectCommand();
+[[nodiscard]] Command LengthCommand();
 [[nodiscard]] Command SplitCommand();
+[[nodiscard]] Command TangentsCommand();
 
 /// The table, in the order in which the help lists it.
 [[nodiscard]] inline std::vector<Command> Commands()
 {
-    return {FlattenCommand(), SplitCommand(), ClosestCommand()};
+    return {FlattenCommand(), SplitCommand(),     ClosestCommand(),  CurvatureCommand(), LengthCommand(),
+            BoundsCommand(),  IntersectCommand(), TangentsCommand(), AreaCommand(),      CuspsCommand()};
 }
 
 /// Calls f(curve, index) with each curve of a job's drawing in turn, and keeps the progress.
@@ -72,6 +80,28 @@ void ForEachCurve(const Job& job, const std::string& task, F f)
             f(curve, index++);
             job.progress.Step();
         }
+}
+
+/// A curve as the library is asked about it where there is no `POINT` overload: with --integer, the one whose control
+/// points are rounded.
+[[nodiscard]] inline Cubic Asked(const Job& job, const Cubic& curve)
+{
+    return job.integer ? ToDouble(Rounded(curve)) : curve;
+}
+
+/// Calls f(contour, index) with each contour of a job's drawing in turn, its curves as `Asked`, and keeps the progress.
+template <typename F>
+void ForEachContour(const Job& job, const std::string& task, F f)
+{
+    job.progress.Begin(task, CountCurves(job.drawing));
+    for (std::size_t index = 0; index < job.drawing.contours.size(); ++index) {
+        Contour contour = job.drawing.contours[index];
+        for (Cubic& curve : contour.curves)
+            curve = Asked(job, curve);
+        f(contour, index);
+        for (std::size_t i = 0; i < contour.curves.size(); ++i)
+            job.progress.Step();
+    }
 }
 
 } // namespace curvelab
