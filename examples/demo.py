@@ -41,16 +41,18 @@ def scenes(fonts):
                ["closest", *drawing(name), "--to", to])
     yield ("flatten nautilus.svg, whole units", "A drawing 2000 units wide, in integers: vertices are rounded.",
            ["flatten", *drawing("nautilus.svg"), "--tolerance", "2", "--units", "2000", "--integer"])
-    for name, distance, to in (("nautilus.svg", "2500", "90000,-4000"), ("rose-window.svg", "3500", "-6000,50000")):
-        yield (f"curvature {name}", "The comb: a tooth is as long as the curve bends. Dots where the speed is extreme.",
+    for name in ("nautilus.svg", "knots.svg"):
+        yield (f"curvature {name}", "The comb: its teeth are as long as the curve bends. Dots where the speed is extreme.",
                ["curvature", *drawing(name)])
+        yield (f"intersect {name}", "Every place where two curves cross, or one crosses itself.",
+               ["intersect", *drawing(name)])
+        yield (f"area {name}", "Which way each closed contour runs, and what it encloses.", ["area", *drawing(name)])
+    for name, to in (("nautilus.svg", "90000,-4000"), ("rose-window.svg", "50000,50000")):
         yield (f"length {name}", "Rulers: ticks at equal lengths along each contour.",
                ["length", *drawing(name), "--spacing", "1000"])
         yield (f"bounds {name}", "The tight box of each curve, of each contour and of all.", ["bounds", *drawing(name)])
-        yield (f"intersect {name}", "Every place where two curves cross, or one crosses itself.",
-               ["intersect", *drawing(name)])
         yield (f"tangents {name}", "All tangents through a point.", ["tangents", *drawing(name), "--to", to])
-        yield (f"area {name}", "Which way each contour runs, and what it encloses.", ["area", *drawing(name)])
+    for name, distance in (("nautilus.svg", "-2500"), ("rose-window.svg", "-2500"), ("knots.svg", "2500")):
         yield (f"cusps {name}", "Offset curves, and where they turn back.",
                ["cusps", *drawing(name), "--distance", distance])
     for font in fonts:
@@ -67,13 +69,11 @@ def scenes(fonts):
                ["length", *text("Rag&", font), "--spacing", "1000"])
         yield (f"bounds of letters, {family}", "Boxes, and the places where a coordinate is extreme.",
                ["bounds", *text("Rag&", font)])
-        yield (f"intersect a line of text, {family}", "Outlines that overlap cross each other.",
-               ["intersect", *text("Ampersand &", font)])
         yield (f"tangents to letters, {family}", "All tangents through a point below the line.",
                ["tangents", *text("Rag&", font), "--to", "50000,-12000"])
         yield (f"area of letters, {family}", "Counters run the other way round: their area is subtracted.",
                ["area", *text("Rag&", font)])
-        yield (f"cusps in letters, {family}", "Letters made bolder: where the offset turns back.",
+        yield (f"cusps in letters, {family}", "An offset to the left of the outlines, and where it turns back.",
                ["cusps", *text("Rag&", font), "--distance", "900"])
 
 

@@ -32,7 +32,8 @@ struct Totals
     std::vector<std::vector<Tooth>> combs; ///< of each curve
     std::vector<Place> speedExtremes;
     std::vector<Place> inflections;
-    std::int64_t missedInflections = 0; ///< those that curvelab finds beside the library
+    std::int64_t missedInflections = 0; ///< those that the library does not list
+    std::int64_t strayInflections = 0;  ///< those that it lists elsewhere
 };
 
 Tooth SampleAt(const PowerForm& p, double t)
@@ -116,21 +117,21 @@ void AddPlaces(const PowerForm& p, std::size_t curve, const std::vector<double>&
 
 void AddInflections(const PowerForm& p, std::size_t curve, Totals& totals)
 {
-    std::vector<double> inflections = ListedInflections(p);
-    for (const double t : AllInflections(p))
-        if (!Holds(inflections, t)) {
-            inflections.push_back(t);
-            ++totals.missedInflections;
-        }
-    AddPlaces(p, curve, inflections, totals.inflections);
+    const std::vector<double> listed = ListedInflections(p), all = AllInflections(p);
+    for (const double t : listed)
+        totals.strayInflections += Holds(all, t) ? 0 : 1;
+    for (const double t : all)
+        totals.missedInflections += Holds(listed, t) ? 0 : 1;
+    AddPlaces(p, curve, all, totals.inflections);
 }
 
-/// How many steps between the teeth of a curve: so many that they stand a few pixels apart.
+/// How many steps from tooth to tooth of a curve: so many that they stand a few pixels apart, and enough for a round
+/// outline on a small one.
 int StepsFor(const Cubic& curve, double pixelsPerUnit)
 {
-    constexpr double gap = 6.0;
+    constexpr double gap = 5.0;
     const double length = LengthOf(Sampled(curve, 16)) * pixelsPerUnit;
-    return static_cast<int>(std::clamp(length / gap, 4.0, 400.0));
+    return static_cast<int>(std::clamp(length / gap, 12.0, 400.0));
 }
 
 Totals Find(const Job& job, double pixelsPerUnit)
@@ -150,18 +151,29 @@ Totals Find(const Job& job, double pixelsPerUnit)
     return totals;
 }
 
-/// The curvature that nine of ten teeth do not exceed; 0 without teeth.
+/// The curvature that is not exceeded on three quarters of the length of all combs; 0 without any.
 double TypicalCurvature(const Totals& totals)
 {
-    std::vector<double> sizes;
+    struct Stretch
+    {
+        double curvature;
+        double length;
+    };
+
+    std::vector<Stretch> stretches;
+    double total = 0.0;
     for (const std::vector<Tooth>& comb : totals.combs)
-        for (const Tooth& tooth : comb)
-            sizes.push_back(std::fabs(tooth.curvature));
-    if (sizes.empty())
-        return 0.0;
-    const auto place = sizes.begin() + static_cast<std::ptrdiff_t>(0.9 * static_cast<double>(sizes.size() - 1));
-    std::nth_element(sizes.begin(), place, sizes.end());
-    return *place;
+        for (std::size_t i = 1; i < comb.size(); ++i) {
+            stretches.push_back({std::fabs(comb[i].curvature), Distance(comb[i - 1].point, comb[i].point)});
+            total += stretches.back().length;
+        }
+    std::sort(stretches.begin(), stretches.end(),
+              [](const Stretch& a, const Stretch& b) { return a.curvature < b.curvature; });
+    double length = 0.0;
+    for (const Stretch& each : stretches)
+        if ((length += each.length) >= 0.75 * total)
+            return each.curvature;
+    return 0.0;
 }
 
 /// How the comb is drawn.
@@ -171,11 +183,11 @@ struct Scale
     double longest;      ///< where teeth are cut, in drawing units
 };
 
-/// The typical tooth gets the stated length. Teeth longer than three of these are cut: near a cusp they have no bounds.
+/// The typical tooth gets the stated length. Teeth longer than two of these are cut: near a cusp they have no bounds.
 Scale ScaleFor(const Totals& totals, double tooth)
 {
     const double typical = TypicalCurvature(totals);
-    return {typical > 0.0 ? tooth / typical : 0.0, 3.0 * tooth};
+    return {typical > 0.0 ? tooth / typical : 0.0, 2.0 * tooth};
 }
 
 bool IsCut(const Tooth& tooth, const Scale& scale)
@@ -255,6 +267,7 @@ void Describe(const Totals& totals, const Scale& scale, Report& report)
     report.Add("speedExtremes", "extremes of speed", static_cast<std::int64_t>(totals.speedExtremes.size()));
     report.Add("inflections", "inflections", static_cast<std::int64_t>(totals.inflections.size()));
     report.Add("missedInflections", "of these, not listed", totals.missedInflections);
+    report.Add("strayInflections", "listed, and elsewhere", totals.strayInflections);
     report.Add("teeth", "teeth", teeth);
     report.Add("cutTeeth", "cut short", cut);
     report.AddNumbers("toothPerCurvature", scale.perCurvature);
@@ -356,7 +369,7 @@ Command CurvatureCommand()
         "curvature",
         "Draws the curvature comb, inflections and where the speed is extreme",
         "A tooth of the comb is as long as the curvature is strong, on the outer side of the bend; teeth of more than\n"
-        "three times the length of --tooth are cut short. The strongest curvature is that of the teeth. The library's\n"
+        "twice the length of --tooth are cut short. The strongest curvature is that of the teeth. The library's\n"
         "FindCurvatureMinMax lists, despite its name, the extremes of the SPEED, as those of its sixth power |P'|^6: "
         "on\n"
         "common curves they lie near the sharpest and the flattest places, but curvature does not enter. Inflections "
@@ -367,7 +380,9 @@ Command CurvatureCommand()
         "have\n"
         "no comb. There are no integer overloads: --integer asks about the rounded control points in double.",
         {{"--tooth", "PERCENT",
-          "Length of a tooth that is longer than nine of ten, in percent of the drawing's larger side, 0 to 50", "5"}},
+          "Length of the tooth that is not exceeded on three quarters of the curves' length, in percent of the "
+          "drawing's larger side, 0 to 50",
+          "2.5"}},
         Prepare};
 }
 

@@ -2,7 +2,7 @@
 #include "Measure.h"
 
 #include <algorithm>
-#include <cmath>
+#include <array>
 #include <optional>
 #include <utility>
 
@@ -32,6 +32,7 @@ struct Crossing
     double t;
     double s;
     point2d point;
+    bool isContact = false; ///< whether an end of one lies on the other there, and neither listed a crossing
 };
 
 /// What is known after all pairs.
@@ -40,6 +41,7 @@ struct Totals
     std::vector<Crossing> crossings;
     std::int64_t asked = 0;    ///< pairs whose boxes overlap
     std::int64_t bent = 0;     ///< pairs of parabolas, of which one was given a cubic term
+    std::int64_t missed = 0;   ///< crossings found on pieces of the curves only
     std::int64_t together = 0; ///< crossings where the two curves run along each other
     std::int64_t selves = 0;   ///< crossings of a curve with itself
     std::int64_t loops = 0;    ///< loops found only when magnified
@@ -67,6 +69,7 @@ struct Listed
     std::vector<double> firstParameters;
     std::vector<double> secondParameters;
     std::vector<point2d> points;
+    std::size_t onWhole = 0; ///< how many of them the whole curves show; those of pieces follow
 };
 
 Listed Ask(const Cubic& first, const Cubic& second)
@@ -83,6 +86,57 @@ Listed Ask(const IntegerCubic& first, const IntegerCubic& second)
     ZarnMath::CubicBezier::FindBezierIntersections(first.data(), second.data(), listed.firstParameters,
                                                    listed.secondParameters, listed.points);
     return listed;
+}
+
+/// A piece of a curve, the one from `from` to `from + width` of its parameters.
+struct Piece
+{
+    Cubic curve;
+    double from;
+    double width;
+};
+
+/// The two pieces of an uneven cut.
+std::array<Piece, 2> Pieces(const Cubic& curve)
+{
+    constexpr double cut = 3.0 / 7.0;
+    std::array<Piece, 2> pieces{{{{}, 0.0, cut}, {{}, cut, 1.0 - cut}}};
+    ZarnMath::CubicBezier::Split(cut, curve.points, pieces[0].curve.points, pieces[1].curve.points);
+    return pieces;
+}
+
+/// The parameter at which a curve runs within 0.1 units of a point.
+std::optional<double> ParameterAt(const Cubic& curve, const point2d& q)
+{
+    const PowerForm p = ToPowerForm(curve);
+    std::vector<double> parameters;
+    const bool isOn = ZarnMath::CubicBezier::Invert(p.a, p.b, p.c, p.d, q, parameters);
+    return isOn ? std::optional(parameters.front()) : std::nullopt;
+}
+
+bool Holds(const std::vector<point2d>& points, const point2d& p)
+{
+    return std::any_of(points.begin(), points.end(), [&](const point2d& q) { return Distance(p, q) <= reach; });
+}
+
+/// Adds the crossings of the pieces that the whole curves do not list. The library's searches halve the range of a
+/// parameter, and a root exactly on a cut is lost, as in the middle of a symmetric figure; on the pieces of an uneven cut it
+/// lies elsewhere. A piece is straighter than its curve, so the band of straight curves is narrowed to 0.1 units here.
+void AddMissed(const Cubic& first, const Cubic& second, Listed& listed)
+{
+    listed.onWhole = listed.points.size();
+    for (const Piece& one : Pieces(first))
+        for (const Piece& other : Pieces(second)) {
+            const Listed found = Ask(one.curve, other.curve);
+            for (std::size_t i = 0; i < found.points.size(); ++i) {
+                const point2d& p = found.points[i];
+                if (Holds(listed.points, p) || !ParameterAt(one.curve, p) || !ParameterAt(other.curve, p))
+                    continue;
+                listed.firstParameters.push_back(one.from + one.width * found.firstParameters[i]);
+                listed.secondParameters.push_back(other.from + other.width * found.secondParameters[i]);
+                listed.points.push_back(p);
+            }
+        }
 }
 
 bool IsParabola(const Cubic& curve)
@@ -103,14 +157,10 @@ Cubic Bent(Cubic curve, double drawingSize)
 bool RunTogether(const Candidate& one, const Candidate& other, double s)
 {
     constexpr double step = 0.1;
-    const PowerForm p = ToPowerForm(one.curve), q = ToPowerForm(other.curve);
-    std::vector<double> parameters;
-    for (const double near : {s - step, s + step}) {
-        parameters.clear();
-        if (near >= 0.0 && near <= 1.0 &&
-            !ZarnMath::CubicBezier::Invert(p.a, p.b, p.c, p.d, Evaluate(q, near), parameters))
+    const PowerForm p = ToPowerForm(other.curve);
+    for (const double near : {s - step, s + step})
+        if (near >= 0.0 && near <= 1.0 && !ParameterAt(one.curve, Evaluate(p, near)))
             return false;
-    }
     return true;
 }
 
@@ -121,23 +171,51 @@ bool IsJoint(const Candidate& one, const Candidate& other, const point2d& p)
     return goesOn || (other.next == one.index && Distance(p, other.curve[3]) <= reach);
 }
 
+/// All that is listed for two curves, one way or another.
+Listed AskAll(const Candidate& one, const Candidate& other, const Job& job, Totals& totals)
+{
+    Listed listed = job.integer ? Ask(one.whole, other.whole) : Ask(one.curve, other.curve);
+    Cubic first = one.curve;
+    if (IsParabola(one.curve) && IsParabola(other.curve)) {
+        ++totals.bent;
+        first = Bent(one.curve, LargerSide(job.drawing.bounds));
+        if (listed.points.empty())
+            listed = Ask(first, other.curve);
+    }
+    AddMissed(first, other.curve, listed);
+    return listed;
+}
+
+/// The ends of the first curve that lie on the second.
+void AddContacts(const Candidate& one, const Candidate& other, std::vector<Crossing>& crossings)
+{
+    for (const double t : {0.0, 1.0}) {
+        const point2d& end = one.curve[t == 0.0 ? 0 : 3];
+        if (IsJoint(one, other, end))
+            continue;
+        if (const std::optional<double> s = ParameterAt(other.curve, end))
+            crossings.push_back({one.index, other.index, t, *s, end, true});
+    }
+}
+
 void CrossPair(const Candidate& one, const Candidate& other, const Job& job, Totals& totals)
 {
     ++totals.asked;
-    Listed listed = job.integer ? Ask(one.whole, other.whole) : Ask(one.curve, other.curve);
-    if (listed.points.empty() && IsParabola(one.curve) && IsParabola(other.curve)) {
-        ++totals.bent;
-        listed = Ask(Bent(one.curve, LargerSide(job.drawing.bounds)), other.curve);
-    }
+    const Listed listed = AskAll(one, other, job, totals);
     for (std::size_t i = 0; i < listed.points.size(); ++i) {
-        if (IsJoint(one, other, listed.points[i]))
+        const point2d& p = listed.points[i];
+        const double t = listed.firstParameters[i], s = listed.secondParameters[i];
+        if (IsJoint(one, other, p))
             continue;
-        if (RunTogether(one, other, listed.secondParameters[i]))
+        if (RunTogether(one, other, s)) {
             ++totals.together;
-        else
-            totals.crossings.push_back(
-                {one.index, other.index, listed.firstParameters[i], listed.secondParameters[i], listed.points[i]});
+            continue;
+        }
+        totals.missed += i >= listed.onWhole ? 1 : 0;
+        totals.crossings.push_back({one.index, other.index, t, s, p});
     }
+    AddContacts(one, other, totals.crossings);
+    AddContacts(other, one, totals.crossings);
 }
 
 bool HasLoop(const Candidate& each)
@@ -199,7 +277,8 @@ bool IsSame(const std::vector<Candidate>& candidates, const Crossing& one, const
     return sameCurves && Distance(one.point, other.point) <= reach;
 }
 
-/// Leaves one of the crossings that are the same; the others stay in the order of their x.
+/// Leaves one of the crossings that are the same, a contact only if there is nothing else; the others stay in the order of
+/// their x.
 void RemoveRepeats(const std::vector<Candidate>& candidates, std::vector<Crossing>& crossings)
 {
     std::sort(crossings.begin(), crossings.end(),
@@ -207,8 +286,11 @@ void RemoveRepeats(const std::vector<Candidate>& candidates, std::vector<Crossin
     std::vector<Crossing> kept;
     for (const Crossing& each : crossings) {
         bool isRepeat = false;
-        for (auto i = kept.rbegin(); i != kept.rend() && each.point.x - i->point.x <= reach && !isRepeat; ++i)
+        for (auto i = kept.rbegin(); i != kept.rend() && each.point.x - i->point.x <= reach && !isRepeat; ++i) {
             isRepeat = IsSame(candidates, *i, each);
+            if (isRepeat && i->isContact)
+                *i = each;
+        }
         if (!isRepeat)
             kept.push_back(each);
     }
@@ -240,57 +322,76 @@ Totals Find(const std::vector<Candidate>& candidates, const Job& job)
     return totals;
 }
 
-void Describe(const Totals& totals, std::size_t curves, Report& report)
+void AddPlaces(const std::vector<Crossing>& crossings, bool contacts, const std::string& suffix, Report& report)
 {
     std::vector<std::int64_t> first, second;
     std::vector<double> t, s;
     std::vector<point2d> points;
-    for (const Crossing& each : totals.crossings) {
+    for (const Crossing& each : crossings) {
+        if (each.isContact != contacts)
+            continue;
         first.push_back(static_cast<std::int64_t>(each.first));
         second.push_back(static_cast<std::int64_t>(each.second));
         t.push_back(each.t);
         s.push_back(each.s);
         points.push_back(each.point);
     }
+    report.AddNumbers("points" + suffix, points);
+    report.AddNumbers("firstCurve" + suffix, first);
+    report.AddNumbers("secondCurve" + suffix, second);
+    report.AddNumbers("firstT" + suffix, t);
+    report.AddNumbers("secondT" + suffix, s);
+}
+
+void Describe(const Totals& totals, std::size_t curves, Report& report)
+{
+    const std::vector<Crossing>& all = totals.crossings;
+    const std::int64_t contacts = std::count_if(all.begin(), all.end(), [](const Crossing& c) { return c.isContact; });
     const auto count = static_cast<std::int64_t>(curves);
-    report.Add("crossings", "crossings", static_cast<std::int64_t>(points.size()));
+    report.Add("crossings", "crossings", static_cast<std::int64_t>(all.size()) - contacts);
     report.Add("selfCrossings", "of a curve with itself", totals.selves);
+    report.Add("contacts", "ends on other curves", contacts);
     report.Add("curves", "curves", count);
     report.Add("pairs", "pairs of curves", count * (count - 1) / 2);
     report.Add("pairsAsked", "pairs asked", totals.asked);
-    report.Add("bentPairs", "pairs of parabolas, bent", totals.bent);
+    report.Add("missedCrossings", "found on pieces only", totals.missed);
     report.Add("magnifiedLoops", "loops found magnified", totals.loops);
+    report.Add("bentPairs", "pairs of parabolas", totals.bent);
     report.Add("runTogether", "left out, run together", totals.together);
-    report.AddNumbers("points", points);
-    report.AddNumbers("firstCurve", first);
-    report.AddNumbers("secondCurve", second);
-    report.AddNumbers("firstT", t);
-    report.AddNumbers("secondT", s);
+    AddPlaces(all, false, "", report);
+    AddPlaces(all, true, "OfContacts", report);
 }
 
 void Show(const std::vector<Candidate>& candidates, const Totals& totals, Picture& picture)
 {
     std::vector<bool> takesPart(candidates.size());
     for (const Crossing& each : totals.crossings)
-        takesPart[each.first] = takesPart[each.second] = true;
-    const double dot = picture.DotWidth(totals.crossings.size(), 60.0 * LargerSide(candidates.front().box), 9.0);
+        if (!each.isContact)
+            takesPart[each.first] = takesPart[each.second] = true;
+    double length = 0.0;
+    for (const Candidate& each : candidates)
+        length += Distance(each.curve[0], each.curve[3]);
+    const double dot = picture.DotWidth(totals.crossings.size(), length, 9.0);
     const Style curve{colour::blue, 2.0, "", 1.0};
     const Style pair{colour::orange, dot, "", 1.0};
     const Style self{colour::green, dot, "", 1.0};
+    const Style contact{colour::ink, 0.75 * dot, "", 1.0};
     Layer& curves = picture.AddLayer(curve);
     for (const Candidate& each : candidates)
         if (takesPart[each.index])
             curves.AddCurve(each.curve);
     Layer& halos = picture.AddLayer({colour::paper, dot + 3.0, "", 1.0});
+    Layer& contacts = picture.AddLayer(contact);
     Layer& pairs = picture.AddLayer(pair);
     Layer& selves = picture.AddLayer(self);
     for (const Crossing& each : totals.crossings) {
         halos.AddDot(each.point);
-        (each.first == each.second ? selves : pairs).AddDot(each.point);
+        (each.isContact ? contacts : each.first == each.second ? selves : pairs).AddDot(each.point);
     }
     picture.AddLegend(curve, Sample::Stroke, "curves that cross");
     picture.AddLegend(pair, Sample::Dot, "crossings of two");
     picture.AddLegend(self, Sample::Dot, "of one with itself");
+    picture.AddLegend(contact, Sample::Dot, "an end on another curve");
 }
 
 void Run(const Job& job, Report& report, Picture& picture)
@@ -315,14 +416,20 @@ Command IntersectCommand()
         "Finds where the curves of the drawing cross each other and themselves",
         "Every pair of curves whose boxes overlap is asked, and each curve with itself. The end that two curves share "
         "in\n"
-        "a contour is no crossing. The library looks inside the curves: two that meet only at ends, or touch, do not\n"
-        "cross. Of two parabolas, as in fonts with quadratic outlines, it lists nothing; curvelab asks once more with "
+        "a contour is no crossing. The library looks inside the curves, for crossings and not for touches: an end "
+        "that\n"
+        "lies on another curve is told apart, be it a touch or a place where the contour crosses. A crossing exactly "
+        "on a\n"
+        "cut of the library's search is lost; curvelab asks the pieces of uneven cuts as well, and counts what only "
+        "they\n"
+        "show. Of two parabolas, as in fonts with quadratic outlines, the library lists nothing; one of them is given "
         "a\n"
-        "hundred millionth of the drawing as cubic term. A loop that it detects and finds too small is asked for\n"
+        "hundred millionth of the drawing as cubic term. A loop that is detected, and too small to be found, is asked "
+        "for\n"
         "magnified. Where two curves run along each other there is no crossing. Repeats within 2 units at a joint "
         "count\n"
         "once. All lengths inside the library are absolute: with few --units, curves count as straight lines. With\n"
-        "--integer the integer overloads are asked, except for those repetitions.",
+        "--integer the integer overloads are asked, except where curvelab asks once more.",
         {},
         Prepare};
 }

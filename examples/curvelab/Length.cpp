@@ -194,9 +194,9 @@ void Show(double spacing, const std::vector<Mark>& marks, Picture& picture)
             halos.AddDot(PointOf(mark));
             starts.AddDot(PointOf(mark));
         } else if (mark.number % (10 * interval) == 0)
-            AddTick(mark, 10.0 * pixel, tenths);
+            AddTick(mark, 7.0 * pixel, tenths);
         else if (mark.number % interval == 0)
-            AddTick(mark, 5.0 * pixel, ticks);
+            AddTick(mark, 3.5 * pixel, ticks);
     }
     picture.AddLegend(start, Sample::Dot, "start of a contour");
     picture.AddLegend(tick, Sample::Stroke, TickText(interval));

@@ -13,31 +13,6 @@ constexpr const char* circle = "<circle cx='300' cy='200' r='150'/>";
 constexpr double circleError = 2.73e-4 * 50000.0;
 constexpr double centre = 50000.0;
 
-/// Runs a command on a drawing and gives its JSON.
-Numbers Ask(const std::string& content, std::vector<std::string> arguments)
-{
-    const TemporaryFolder folder;
-    arguments.insert(arguments.begin() + 1, folder.WriteSvg(content));
-    arguments.push_back("--json=-");
-    const Outcome outcome = RunCurvelab(arguments, folder.Path());
-    EXPECT_EQ(outcome.status, 0) << outcome.err;
-    EXPECT_EQ(outcome.err, "");
-    return Numbers(outcome.out);
-}
-
-std::string Number(double value)
-{
-    char text[40];
-    std::snprintf(text, sizeof text, "%.17g", value);
-    return text;
-}
-
-void ExpectPoint(const Numbers& json, const std::string& pointer, double x, double y, double tolerance)
-{
-    EXPECT_NEAR(json.Number(pointer + "/0"), x, tolerance);
-    EXPECT_NEAR(json.Number(pointer + "/1"), y, tolerance);
-}
-
 } // namespace
 
 TEST(Program, DescribesTheDrawing)
@@ -265,7 +240,8 @@ TEST(Program, ExplainsItself)
     const TemporaryFolder folder;
     const Outcome all = RunCurvelab({"--help"}, folder.Path());
     EXPECT_EQ(all.status, 0);
-    for (const char* command : {"flatten", "split", "closest"}) {
+    for (const char* command :
+         {"flatten", "split", "closest", "curvature", "length", "bounds", "intersect", "tangents", "area", "cusps"}) {
         EXPECT_NE(all.out.find(command), std::string::npos);
         const Outcome one = RunCurvelab({command, "--help"}, folder.Path());
         EXPECT_EQ(one.status, 0);

@@ -1,6 +1,7 @@
 #include "Program.h"
 
 #include <algorithm>
+#include <cstdio>
 #include <cstdlib>
 #include <fcntl.h>
 #include <fstream>
@@ -149,4 +150,28 @@ std::string ContentOf(const fs::path& path)
     std::ostringstream content;
     content << file.rdbuf();
     return content.str();
+}
+
+Numbers Ask(const std::string& content, std::vector<std::string> arguments)
+{
+    const TemporaryFolder folder;
+    arguments.insert(arguments.begin() + 1, folder.WriteSvg(content));
+    arguments.push_back("--json=-");
+    const Outcome outcome = RunCurvelab(arguments, folder.Path());
+    EXPECT_EQ(outcome.status, 0) << outcome.err;
+    EXPECT_EQ(outcome.err, "");
+    return Numbers(outcome.out);
+}
+
+std::string Number(double value)
+{
+    char text[40];
+    std::snprintf(text, sizeof text, "%.17g", value);
+    return text;
+}
+
+void ExpectPoint(const Numbers& json, const std::string& pointer, double x, double y, double tolerance)
+{
+    EXPECT_NEAR(json.Number(pointer + "/0"), x, tolerance);
+    EXPECT_NEAR(json.Number(pointer + "/1"), y, tolerance);
 }

@@ -76,3 +76,15 @@ private:
 
 /// The content of a file; a failure of the test if there is none.
 [[nodiscard]] std::string ContentOf(const std::filesystem::path& path);
+
+/// Runs a command on a drawing and gives its JSON; the test fails if the program does not end well, or says anything else.
+///
+/// @param content   what stands in the root of the SVG file
+/// @param arguments the command's name and its options
+[[nodiscard]] Numbers Ask(const std::string& content, std::vector<std::string> arguments);
+
+/// A number as an argument, to the last bit.
+[[nodiscard]] std::string Number(double value);
+
+/// Expects a pair of coordinates.
+void ExpectPoint(const Numbers& json, const std::string& pointer, double x, double y, double tolerance);
