@@ -139,19 +139,16 @@ Question Prepare(const Arguments&)
 
 Command AreaCommand()
 {
-    return {
-        "area",
-        "Measures the signed area that each closed contour encloses",
-        "The library gives the area between a curve and the x axis, exactly. Over the curves of a closed contour it "
-        "adds\n"
-        "up to the enclosed area, positive for a clockwise contour. Counters of letters run the other way round, so "
-        "that\n"
-        "the sum over them is what is painted, as long as contours do not overlap. A part that a contour runs around\n"
-        "twice counts twice; in a figure of eight the two halves cancel. Compared with the polygon of 4096 chords to "
-        "a\n"
-        "curve. There is no integer overload: --integer asks about the rounded control points in double.",
-        {},
-        Prepare};
+    return {"area",
+            "Measures the signed area that each closed contour encloses",
+            "The library gives the area between a curve and the x axis, exactly. Over the curves of a closed contour\n"
+            "it adds up to the enclosed area, positive for a clockwise contour. Counters of letters run the other way\n"
+            "round, so that the sum over them is what is painted, as long as contours do not overlap. A part that a\n"
+            "contour runs around twice counts twice; in a figure of eight the two halves cancel. Compared with the\n"
+            "polygon of 4096 chords to a curve. There is no integer overload: --integer asks about the rounded\n"
+            "control points in double.",
+            {},
+            Prepare};
 }
 
 } // namespace curvelab

@@ -178,13 +178,11 @@ Command BoundsCommand()
 {
     return {"bounds",
             "Finds the tight box of each curve, each contour and the drawing",
-            "A box is that of the ends of its curves and of the points where a coordinate is extreme, which the "
-            "library finds\n"
-            "as the places of vertical and horizontal tangents inside a curve. The box of the control points is larger "
-            "as a\n"
-            "rule, and never smaller. Checked with 512 samples of each curve, which may lie outside by rounding only. "
-            "There\n"
-            "is no integer overload: --integer asks about the rounded control points in double.",
+            "A box is that of the ends of its curves and of the points where a coordinate is extreme, which the\n"
+            "library finds as the places of vertical and horizontal tangents inside a curve. The box of the control\n"
+            "points is larger as a rule, and never smaller. Checked with 512 samples of each curve, which may lie\n"
+            "outside by rounding only. There is no integer overload: --integer asks about the rounded control points\n"
+            "in double.",
             {},
             Prepare};
 }

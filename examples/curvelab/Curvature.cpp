@@ -365,25 +365,21 @@ Question Prepare(const Arguments& arguments)
 
 Command CurvatureCommand()
 {
-    return {
-        "curvature",
-        "Draws the curvature comb, inflections and where the speed is extreme",
-        "A tooth of the comb is as long as the curvature is strong, on the outer side of the bend; teeth of more than\n"
-        "twice the length of --tooth are cut short. The strongest curvature is that of the teeth. The library's\n"
-        "FindCurvatureMinMax lists, despite its name, the extremes of the SPEED, as those of its sixth power |P'|^6: "
-        "on\n"
-        "common curves they lie near the sharpest and the flattest places, but curvature does not enter. Inflections "
-        "are\n"
-        "those of BezierInflectionPoints that lie inside their curve; it has no answer where the quadratic has no "
-        "leading\n"
-        "term, as on a symmetric S, so curvelab solves it once more and counts what was not listed. Straight curves "
-        "have\n"
-        "no comb. There are no integer overloads: --integer asks about the rounded control points in double.",
-        {{"--tooth", "PERCENT",
-          "Length of the tooth that is not exceeded on three quarters of the curves' length, in percent of the "
-          "drawing's larger side, 0 to 50",
-          "2.5"}},
-        Prepare};
+    return {"curvature",
+            "Draws the curvature comb, inflections and where the speed is extreme",
+            "A tooth of the comb is as long as the curvature is strong, on the outer side of the bend; teeth of more\n"
+            "than twice the length of --tooth are cut short. The strongest curvature is that of the teeth. The\n"
+            "library's FindCurvatureMinMax lists, despite its name, the extremes of the SPEED, as those of its sixth\n"
+            "power |P'|^6: on common curves they lie near the sharpest and the flattest places, but curvature does\n"
+            "not enter. Inflections are asked of BezierInflectionPoints, and those inside their curve are taken.\n"
+            "Where the leading term of its quadratic all but vanishes, as on a symmetric S, it has no answer, or one\n"
+            "that is off; so curvelab solves the quadratic in the form without cancellation, shows these, and counts\n"
+            "where the library's differ by a millionth in t. Straight curves have no comb. There are no integer\n"
+            "overloads: --integer asks about the rounded control points in double.",
+            {{"--tooth", "PERCENT",
+              "Length of a tooth that three quarters of the comb do not exceed, in percent of the larger side, 0 to 50",
+              "2.5"}},
+            Prepare};
 }
 
 } // namespace curvelab

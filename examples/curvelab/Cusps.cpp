@@ -182,21 +182,16 @@ Question Prepare(const Arguments& arguments)
 
 Command CuspsCommand()
 {
-    return {
-        "cusps",
-        "Draws the offset of every curve and marks where it turns back",
-        "The offset of a curve has a cusp where the radius of curvature equals the distance; between two cusps it "
-        "runs\n"
-        "backwards. A positive distance goes to the left, seen along the curve. Offsets are drawn by samples, each "
-        "curve\n"
-        "for itself: at the corners of a contour they neither meet nor are cut. The turns are counted again at 1024\n"
-        "samples of each curve. Where the radius only touches the distance, or the curve itself has a cusp, the "
-        "library\n"
-        "may list one cusp, two or none. There is no integer overload: --integer asks about the rounded control "
-        "points\n"
-        "in double.",
-        {{"--distance", "D", "Distance of the offset, in drawing units; at most ten times the larger side", ""}},
-        Prepare};
+    return {"cusps",
+            "Draws the offset of every curve and marks where it turns back",
+            "The offset of a curve has a cusp where the radius of curvature equals the distance; between two cusps it\n"
+            "runs backwards. A positive distance goes to the left, seen along the curve. Offsets are drawn by\n"
+            "samples, each curve for itself: at the corners of a contour they neither meet nor are cut. The turns are\n"
+            "counted again at 1024 samples of each curve. Where the radius only touches the distance, or the curve\n"
+            "itself has a cusp, the library may list one cusp, two or none. There is no integer overload: --integer\n"
+            "asks about the rounded control points in double.",
+            {{"--distance", "D", "Distance of the offset, in drawing units; at most ten times the larger side", ""}},
+            Prepare};
 }
 
 } // namespace curvelab

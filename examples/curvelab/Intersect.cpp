@@ -411,27 +411,20 @@ Question Prepare(const Arguments&)
 
 Command IntersectCommand()
 {
-    return {
-        "intersect",
-        "Finds where the curves of the drawing cross each other and themselves",
-        "Every pair of curves whose boxes overlap is asked, and each curve with itself. The end that two curves share "
-        "in\n"
-        "a contour is no crossing. The library looks inside the curves, for crossings and not for touches: an end "
-        "that\n"
-        "lies on another curve is told apart, be it a touch or a place where the contour crosses. A crossing exactly "
-        "on a\n"
-        "cut of the library's search is lost; curvelab asks the pieces of uneven cuts as well, and counts what only "
-        "they\n"
-        "show. Of two parabolas, as in fonts with quadratic outlines, the library lists nothing; one of them is given "
-        "a\n"
-        "hundred millionth of the drawing as cubic term. A loop that is detected, and too small to be found, is asked "
-        "for\n"
-        "magnified. Where two curves run along each other there is no crossing. Repeats within 2 units at a joint "
-        "count\n"
-        "once. All lengths inside the library are absolute: with few --units, curves count as straight lines. With\n"
-        "--integer the integer overloads are asked, except where curvelab asks once more.",
-        {},
-        Prepare};
+    return {"intersect",
+            "Finds where the curves of the drawing cross each other and themselves",
+            "Every pair of curves whose boxes overlap is asked, and each curve with itself. The end that two curves\n"
+            "share in a contour is no crossing. The library looks inside the curves, for crossings and not for\n"
+            "touches: an end that lies on another curve is told apart, be it a touch or a place where the contour\n"
+            "crosses. A crossing exactly on a cut of the library's search is lost; curvelab asks the pieces of uneven\n"
+            "cuts as well, and counts what only they show. Of two parabolas, as in fonts with quadratic outlines, the\n"
+            "library lists nothing; one of them is given a hundred millionth of the drawing as cubic term. A loop\n"
+            "that is detected, and too small to be found, is asked for magnified. Where two curves run along each\n"
+            "other there is no crossing. Repeats within 2 units at a joint count once. All lengths inside the library\n"
+            "are absolute: with few --units, curves count as straight lines. With --integer the integer overloads are\n"
+            "asked, except where curvelab asks once more.",
+            {},
+            Prepare};
 }
 
 } // namespace curvelab

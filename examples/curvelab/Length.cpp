@@ -14,21 +14,26 @@ namespace {
 constexpr ZarnMath::LengthAccuracy accuracy = ZarnMath::LengthAccuracy::Order16;
 constexpr double mostMarks = 100000.0;
 
-/// A curve with its length, by the library and by its polyline.
+/// A curve with its length by the library. Where the speed all but vanishes its square can round below zero, and the
+/// quadrature ends in NaN.
 struct Piece
 {
     Cubic curve;
     double length;
-    std::vector<double> along; ///< the length of the polyline up to each of its vertices
+
+    [[nodiscard]] bool HasLength() const
+    {
+        return length > 0.0;
+    }
 };
 
-/// A contour cut into pieces.
+/// A contour as a chain of pieces.
 struct Road
 {
     std::vector<Piece> pieces;
     bool closed;
-    double length = 0.0;
-    double polyline = 0.0;
+    double length = 0.0;   ///< of the pieces that have one
+    double polyline = 0.0; ///< measured when it is walked
 };
 
 /// A point at a multiple of the spacing.
@@ -41,38 +46,46 @@ struct Mark
     double along; ///< where it is on the fine polyline of its contour
 };
 
-std::vector<double> LengthsAlong(const Cubic& curve)
-{
-    const std::vector<point2d> points = Sampled(curve, fineChords);
-    std::vector<double> along{0.0};
-    along.reserve(points.size());
-    for (std::size_t i = 1; i < points.size(); ++i)
-        along.push_back(along.back() + Distance(points[i - 1], points[i]));
-    return along;
-}
-
 Road Survey(const Contour& contour)
 {
     Road road{{}, contour.closed};
     for (const Cubic& curve : contour.curves) {
-        const double length = ZarnMath::CubicBezier::Length(curve.points, accuracy);
-        std::vector<double> along = LengthsAlong(curve);
-        // Where the speed all but vanishes its square can round below zero, and the quadrature ends in NaN.
-        road.length += length > 0.0 ? length : 0.0;
-        road.polyline += along.back();
-        road.pieces.push_back({curve, length, std::move(along)});
+        const Piece& piece =
+            road.pieces.emplace_back(Piece{curve, ZarnMath::CubicBezier::Length(curve.points, accuracy)});
+        road.length += piece.HasLength() ? piece.length : 0.0;
     }
     return road;
 }
 
-/// The length of a piece's polyline from its start to a parameter.
-double AlongPolyline(const Piece& piece, double t)
+/// A curve's fine polyline.
+class Tape
 {
-    const double place = t * fineChords;
-    const auto vertex = std::min(static_cast<std::size_t>(place), piece.along.size() - 2);
-    const double rest = place - static_cast<double>(vertex);
-    return piece.along[vertex] + rest * (piece.along[vertex + 1] - piece.along[vertex]);
-}
+public:
+    explicit Tape(const Cubic& curve)
+    {
+        const std::vector<point2d> points = Sampled(curve, fineChords);
+        along_.reserve(points.size());
+        for (std::size_t i = 1; i < points.size(); ++i)
+            along_.push_back(along_.back() + Distance(points[i - 1], points[i]));
+    }
+
+    /// The length from the start to a parameter.
+    [[nodiscard]] double To(double t) const
+    {
+        const double place = t * fineChords;
+        const auto vertex = std::min(static_cast<std::size_t>(place), along_.size() - 2);
+        const double rest = place - static_cast<double>(vertex);
+        return along_[vertex] + rest * (along_[vertex + 1] - along_[vertex]);
+    }
+
+    [[nodiscard]] double Length() const
+    {
+        return along_.back();
+    }
+
+private:
+    std::vector<double> along_{0.0};
+};
 
 double ParameterAt(const Piece& piece, double length, double tolerance)
 {
@@ -81,23 +94,25 @@ double ParameterAt(const Piece& piece, double length, double tolerance)
                                                                   accuracy);
 }
 
-/// Sets marks along a contour, from its start on; on a closed one the start is not marked again.
-void Walk(const Road& road, std::size_t contour, double spacing, std::vector<Mark>& marks)
+/// Sets marks along a contour, from its start on; on a closed one the start is not marked again. Measures its polyline on
+/// the way.
+void Walk(Road& road, std::size_t contour, double spacing, std::vector<Mark>& marks)
 {
     // A last step that misses the end by rounding reaches it.
     const double slack = 1e-9 * road.length;
     const double end = road.closed ? road.length - slack : road.length + slack;
-    double before = 0.0, polylineBefore = 0.0;
+    double before = 0.0;
     std::int64_t number = 0;
     for (const Piece& piece : road.pieces) {
+        const Tape tape(piece.curve);
         const bool isLast = &piece == &road.pieces.back();
         const double after = isLast ? end : std::min(end, before + piece.length);
-        for (; piece.length > 0.0 && static_cast<double>(number) * spacing <= after; ++number) {
+        for (; piece.HasLength() && static_cast<double>(number) * spacing <= after; ++number) {
             const double t = ParameterAt(piece, static_cast<double>(number) * spacing - before, 1e-6 * spacing);
-            marks.push_back({contour, piece.curve, t, number, polylineBefore + AlongPolyline(piece, t)});
+            marks.push_back({contour, piece.curve, t, number, road.polyline + tape.To(t)});
         }
-        before += piece.length > 0.0 ? piece.length : 0.0;
-        polylineBefore += piece.along.back();
+        before += piece.HasLength() ? piece.length : 0.0;
+        road.polyline += tape.Length();
     }
 }
 
@@ -232,20 +247,16 @@ Question Prepare(const Arguments& arguments)
 
 Command LengthCommand()
 {
-    return {
-        "length",
-        "Measures every contour and sets points along it at equal lengths",
-        "The library takes the length of a curve with 16 samples of its speed, and finds the parameter at a fraction "
-        "of\n"
-        "that length within a millionth of the spacing. The points go on from curve to curve, from the start of each\n"
-        "contour; on a closed one the last step is what is left. Lengths and steps are measured again along 4096 "
-        "chords\n"
-        "to a curve, without the library's help: the quadrature has no control of its error, and a sharp turn between\n"
-        "its samples shows there. At most 100000 points. There is no integer overload for the parameters: --integer "
-        "asks\n"
-        "about the rounded control points in double.",
-        {{"--spacing", "D", "Length from point to point along a contour, in drawing units", ""}},
-        Prepare};
+    return {"length",
+            "Measures every contour and sets points along it at equal lengths",
+            "The library takes the length of a curve with 16 samples of its speed, and finds the parameter at a\n"
+            "fraction of that length within a millionth of the spacing. The points go on from curve to curve, from\n"
+            "the start of each contour; on a closed one the last step is what is left. Lengths and steps are measured\n"
+            "again along 4096 chords to a curve, without the library's help: the quadrature has no control of its\n"
+            "error, and a sharp turn between its samples shows there. At most 100000 points. There is no integer\n"
+            "overload for the parameters: --integer asks about the rounded control points in double.",
+            {{"--spacing", "D", "Length from point to point along a contour, in drawing units", ""}},
+            Prepare};
 }
 
 } // namespace curvelab
