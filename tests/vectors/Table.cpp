@@ -32,13 +32,21 @@ const Table::Entry* Table::Find(const std::string& name) const
 Table MakeTable()
 {
     Table table;
+    AddAnglesAdapters(table);
+    AddBatchesAdapters(table);
     AddBezierToLinesAdapters(table);
     AddBoundsAdapters(table);
+    AddCircleAdapters(table);
+    AddClassificationAdapters(table);
     AddClosestPointAdapters(table);
+    AddConstructorsAdapters(table);
     AddCuttingAdapters(table);
+    AddDecompositionAdapters(table);
     AddLineAdapters(table);
+    AddMatrixAdapters(table);
     AddPlatformAdapters(table);
     AddRootFinderAdapters(table);
+    AddTransformedBoundsAdapters(table);
     AddValueTypesAdapters(table);
     return table;
 }
