@@ -2,20 +2,9 @@
 
 #include "ZarnMath/ValueTypesInternal.h"
 
-#include <algorithm>
-
 namespace ZarnMath {
 
 namespace {
-
-/// A quarter of the 32-bit range to each side.
-constexpr std::int32_t largestInRange = 0x1FFFFFFF;
-constexpr std::int32_t smallestInRange = -0x20000000;
-
-std::int32_t ClampToRange(std::int32_t v) noexcept
-{
-    return std::max(std::min(v, largestInRange), smallestInRange);
-}
 
 /// The rotation as a matrix whose translation holds what the centre contributes to every point.
 MATRIX RotationWithHoistedCentre(double radians, const point2d& centre) noexcept
@@ -30,7 +19,7 @@ void Radians::RotatePoints(POINT* points, unsigned long count, double angle, con
 {
     if (IsNearZero(angle) || static_cast<long>(count) < 1)
         return;
-    ForEachPoint(points, count, RotationWithHoistedCentre(angle, centre), RoundedImage{});
+    TransformRounded(points, count, RotationWithHoistedCentre(angle, centre), wholeRange);
 }
 
 void Degrees::RotatePoints(POINT* points, unsigned long count, double angle, const point2d& centre) noexcept
@@ -56,7 +45,7 @@ using namespace ZarnMath;
 
 void MATRIX::TransformPoints(POINT* points, unsigned long count) const noexcept
 {
-    ForEachPoint(points, count, *this, RoundedImage{});
+    TransformRounded(points, count, *this, wholeRange);
 }
 
 void MATRIX::TransformPoints(point2d* points, unsigned long count) const noexcept
@@ -66,8 +55,5 @@ void MATRIX::TransformPoints(point2d* points, unsigned long count) const noexcep
 
 void MATRIX::TransformPointsWithRangeCheck(POINT* points, unsigned long count) const noexcept
 {
-    ForEachPoint(points, count, *this, [](const POINT& p, const MATRIX& m) {
-        const POINT image = RoundedImage{}(p, m);
-        return POINT{ClampToRange(image.x), ClampToRange(image.y)};
-    });
+    TransformRounded(points, count, *this, checkedRange);
 }

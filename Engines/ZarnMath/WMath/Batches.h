@@ -46,13 +46,19 @@ void ForEachPoint(P* points, std::uint64_t count, const Argument& argument, Step
         points[i] = step(points[i], fixed);
 }
 
-/// The step of every transform of integer points.
-struct RoundedImage
+/// Where a rounded coordinate is cut off: two whole numbers within 32 bits.
+struct CoordinateRange
 {
-    [[nodiscard]] constexpr POINT operator()(const POINT& p, const MATRIX& m) const noexcept
-    {
-        return ToPOINT(Image(m, ToPoint2d(p)));
-    }
+    double smallest;
+    double largest;
 };
+
+/// What an integer coordinate can hold.
+inline constexpr CoordinateRange wholeRange{-2147483648.0, 2147483647.0};
+/// A quarter of it.
+inline constexpr CoordinateRange checkedRange{-0x20000000, 0x1FFFFFFF};
+
+/// Transforms integer points in place: each coordinate as by `RoundToInt`, then cut off at the ends of the range.
+void TransformRounded(POINT* points, std::uint64_t count, const MATRIX& m, CoordinateRange range) noexcept;
 
 } // namespace ZarnMath

@@ -112,5 +112,5 @@ void UTLSkewMatrix(MATRIX* matrix, int angleX, int angleY, int cx, int cy) noexc
 void UTLTransformPoint(Framework::common_types::POINT* points, const MATRIX* matrix, std::int64_t count) noexcept
 {
     if (count > 0)
-        ForEachPoint(points, static_cast<std::uint64_t>(count), *matrix, RoundedImage{});
+        TransformRounded(points, static_cast<std::uint64_t>(count), *matrix, wholeRange);
 }
