@@ -42,11 +42,17 @@ Table MakeTable()
     AddConstructorsAdapters(table);
     AddCuttingAdapters(table);
     AddDecompositionAdapters(table);
+    AddCurvatureAdapters(table);
+    AddCuttingAdapters(table);
+    AddExtentsAdapters(table);
+    AddLengthAdapters(table);
+    AddIntersectionAdapters(table);
     AddLineAdapters(table);
     AddMatrixAdapters(table);
     AddPlatformAdapters(table);
     AddRootFinderAdapters(table);
     AddTransformedBoundsAdapters(table);
+    AddSelfIntersectionAdapters(table);
     AddValueTypesAdapters(table);
     return table;
 }
