@@ -40,19 +40,18 @@ Table MakeTable()
     AddClassificationAdapters(table);
     AddClosestPointAdapters(table);
     AddConstructorsAdapters(table);
-    AddCuttingAdapters(table);
-    AddDecompositionAdapters(table);
     AddCurvatureAdapters(table);
     AddCuttingAdapters(table);
+    AddDecompositionAdapters(table);
     AddExtentsAdapters(table);
-    AddLengthAdapters(table);
     AddIntersectionAdapters(table);
+    AddLengthAdapters(table);
     AddLineAdapters(table);
     AddMatrixAdapters(table);
     AddPlatformAdapters(table);
     AddRootFinderAdapters(table);
-    AddTransformedBoundsAdapters(table);
     AddSelfIntersectionAdapters(table);
+    AddTransformedBoundsAdapters(table);
     AddValueTypesAdapters(table);
     return table;
 }
