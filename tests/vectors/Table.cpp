@@ -32,18 +32,26 @@ const Table::Entry* Table::Find(const std::string& name) const
 Table MakeTable()
 {
     Table table;
+    AddAnglesAdapters(table);
+    AddBatchesAdapters(table);
     AddBezierToLinesAdapters(table);
     AddBoundsAdapters(table);
+    AddCircleAdapters(table);
+    AddClassificationAdapters(table);
     AddClosestPointAdapters(table);
+    AddConstructorsAdapters(table);
     AddCurvatureAdapters(table);
     AddCuttingAdapters(table);
+    AddDecompositionAdapters(table);
     AddExtentsAdapters(table);
-    AddLengthAdapters(table);
     AddIntersectionAdapters(table);
+    AddLengthAdapters(table);
     AddLineAdapters(table);
+    AddMatrixAdapters(table);
     AddPlatformAdapters(table);
     AddRootFinderAdapters(table);
     AddSelfIntersectionAdapters(table);
+    AddTransformedBoundsAdapters(table);
     AddValueTypesAdapters(table);
     return table;
 }
