@@ -36,10 +36,15 @@ Table MakeTable()
     AddBoundsAdapters(table);
     AddClosestPointAdapters(table);
     AddCuttingAdapters(table);
+    AddIntervalVectorAdapters(table);
     AddLineAdapters(table);
+    AddNumericAdapters(table);
     AddPlatformAdapters(table);
     AddRootFinderAdapters(table);
+    AddTridiagonalMatrixAdapters(table);
     AddValueTypesAdapters(table);
+    AddVectorFieldAdapters(table);
+    AddWMath3DAdapters(table);
     return table;
 }
 

@@ -57,10 +57,15 @@ void AddBezierToLinesAdapters(Table& table);
 void AddBoundsAdapters(Table& table);
 void AddClosestPointAdapters(Table& table);
 void AddCuttingAdapters(Table& table);
+void AddIntervalVectorAdapters(Table& table);
 void AddLineAdapters(Table& table);
+void AddNumericAdapters(Table& table);
 void AddPlatformAdapters(Table& table);
 void AddRootFinderAdapters(Table& table);
+void AddTridiagonalMatrixAdapters(Table& table);
 void AddValueTypesAdapters(Table& table);
+void AddVectorFieldAdapters(Table& table);
+void AddWMath3DAdapters(Table& table);
 /// @}
 
 /// Runs one case.
