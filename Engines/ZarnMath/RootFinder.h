@@ -83,14 +83,18 @@ struct PolynomialToBernsteinT
 template <int N>
 [[nodiscard]] inline unsigned SignChanges(const vector2d* bez) noexcept
 {
-    unsigned changes = 0;
-    unsigned zeros = 0;
+    PairMask changing{};
+    PairMask zero{};
+    Pair from = LoadPair(bez[0]);
 #pragma GCC unroll 16
     for (int i = 0; i < N; ++i) {
-        changes |= static_cast<unsigned>(bez[i].y * bez[i + 1].y < 0.0) << i;
-        zeros |= static_cast<unsigned>(bez[i].y == 0.0) << i;
+        const Pair to = LoadPair(bez[i + 1]);
+        changing |= (from * to < Both(0.0)) & PairMask{0, 1 << i};
+        zero |= to == Both(0.0);
+        from = to;
     }
-    if (zeros > 1) [[unlikely]]
+    auto changes = static_cast<unsigned>(changing[1]);
+    if (zero[1] != 0) [[unlikely]]
         for (int i = 1; i < N; ++i)
             changes |= static_cast<unsigned>(bez[i].y == 0.0 && bez[i + 1].y * bez[i - 1].y < 0.0) << i;
     return changes;

@@ -61,38 +61,64 @@ struct CrossingPair
     }
 };
 
-/// Polishes `count` crossings, 2*Pairs - 1 or 2*Pairs of them.
+/// A polynomial and its derivative, each coefficient in both halves of a pair.
+template <int N>
+struct PairedPolynomial
+{
+    Pair value[N + 1];
+    Pair slope[N];
+
+    explicit PairedPolynomial(const double* c) noexcept
+    {
+        const Derivative<N> derivative(c);
+#pragma GCC unroll 16
+        for (int i = 0; i < N; ++i) {
+            value[i] = Both(c[i]);
+            slope[i] = Both(derivative.c[i]);
+        }
+        value[N] = Both(c[N]);
+    }
+};
+
+/// One step of Newton's method on each of the crossings.
+template <int N, int Pairs>
+[[gnu::always_inline]] inline void AdvanceTogether(const PairedPolynomial<N>& p, CrossingPair* pairs) noexcept
+{
+    Pair value[Pairs];
+    Pair slope[Pairs];
+#pragma GCC unroll 4
+    for (int k = 0; k < Pairs; ++k) {
+        value[k] = p.value[0];
+        slope[k] = p.slope[0];
+    }
+#pragma GCC unroll 16
+    for (int i = 1; i < N; ++i) {
+#pragma GCC unroll 4
+        for (int k = 0; k < Pairs; ++k) {
+            value[k] = p.value[i] + pairs[k].t * value[k];
+            slope[k] = p.slope[i] + pairs[k].t * slope[k];
+        }
+    }
+#pragma GCC unroll 4
+    for (int k = 0; k < Pairs; ++k)
+        pairs[k].Advance(p.value[N] + pairs[k].t * value[k], slope[k]);
+}
+
+/// Polishes `count` crossings, 2*Pairs - 1 or more, and at most 2*Pairs of them.
 template <int N, int Pairs>
 void PolishTogether(const double* c, const Crossing* crossings, int count, double* roots) noexcept
 {
-    const Derivative<N> derivative(c);
+    const PairedPolynomial<N> polynomial(c);
     CrossingPair pairs[Pairs];
+    PairMask isOpen{};
 #pragma GCC unroll 4
-    for (int k = 0; k < Pairs; ++k)
+    for (int k = 0; k < Pairs; ++k) {
         pairs[k] = CrossingPair(crossings[2 * k], crossings[2 * k + 1 < count ? 2 * k + 1 : 2 * k]);
-    PairMask isOpen = pairs[0].isOpen | pairs[Pairs - 1].isOpen;
+        isOpen |= pairs[k].isOpen;
+    }
     for (int stepsLeft = 100; stepsLeft > 0 && IsAny(isOpen); --stepsLeft) {
-        Pair value[Pairs];
-        Pair slope[Pairs];
-#pragma GCC unroll 4
-        for (int k = 0; k < Pairs; ++k) {
-            value[k] = Both(c[0]);
-            slope[k] = Both(derivative.c[0]);
-        }
-#pragma GCC unroll 16
-        for (int i = 1; i < N; ++i) {
-#pragma GCC unroll 4
-            for (int k = 0; k < Pairs; ++k) {
-                value[k] = Both(c[i]) + pairs[k].t * value[k];
-                slope[k] = Both(derivative.c[i]) + pairs[k].t * slope[k];
-            }
-        }
-        isOpen = PairMask{};
-#pragma GCC unroll 4
-        for (int k = 0; k < Pairs; ++k) {
-            pairs[k].Advance(Both(c[N]) + pairs[k].t * value[k], slope[k]);
-            isOpen |= pairs[k].isOpen;
-        }
+        AdvanceTogether<N, Pairs>(polynomial, pairs);
+        isOpen = pairs[0].isOpen | pairs[Pairs - 1].isOpen;
     }
 #pragma GCC unroll 4
     for (int k = 0; k < Pairs; ++k) {

@@ -1,0 +1,126 @@
+// The root finder on polynomials made from random Bernstein coefficients in [-1, 1], beside its plain form and beside a
+// peer's Bernstein root finder on the same polynomials. The three run in turn on the same corpus; what counts are their
+// ratios. "roots" is the mean number of roots that each of them finds.
+
+#include "ZarnMath/RootFinder.h"
+#include "tests/LiteralRootFinder.h"
+
+#include <array>
+#include <benchmark/benchmark.h>
+#include <random>
+#include <vector>
+
+#ifdef ZARNMATH_BENCH_LIB2GEOM
+#include <2geom/bezier.h>
+#endif
+
+namespace ZarnMath {
+namespace {
+
+constexpr int corpusSize = 2000;
+
+template <int N>
+using Ordinates = std::array<double, N + 1>;
+
+template <int N>
+std::vector<Ordinates<N>> RandomPolygons()
+{
+    std::mt19937_64 engine(N);
+    std::uniform_real_distribution<double> ordinate(-1.0, 1.0);
+    std::vector<Ordinates<N>> polygons(corpusSize);
+    for (auto& polygon : polygons)
+        for (double& y : polygon)
+            y = ordinate(engine);
+    return polygons;
+}
+
+/// Highest power first, by forward differences.
+template <int N>
+std::array<double, N + 1> ToCoefficients(Ordinates<N> differences)
+{
+    std::array<double, N + 1> c;
+    for (std::size_t i = 0; i <= N; ++i) {
+        c[N - i] = Literal::binomials[N][i] * differences[0];
+        for (std::size_t j = 0; j + i < N; ++j)
+            differences[j] = differences[j + 1] - differences[j];
+    }
+    return c;
+}
+
+template <int N, int (*Find)(const double*, double*, bool)>
+void RunOnCoefficients(benchmark::State& state)
+{
+    std::vector<std::array<double, N + 1>> polynomials;
+    for (const auto& polygon : RandomPolygons<N>())
+        polynomials.push_back(ToCoefficients<N>(polygon));
+    std::int64_t found = 0;
+    std::size_t next = 0;
+    for (auto _ : state) {
+        double roots[N + 1];
+        found += Find(polynomials[next].data(), roots, false);
+        benchmark::DoNotOptimize(roots);
+        next = next + 1 < polynomials.size() ? next + 1 : 0;
+    }
+    state.counters["roots"] = benchmark::Counter(static_cast<double>(found), benchmark::Counter::kAvgIterations);
+}
+
+template <int N>
+int FindFast(const double* c, double* roots, bool includeEndpoints)
+{
+    return RootFinder::FindRoots<N>(c, roots, includeEndpoints);
+}
+
+template <int N>
+void FindRoots(benchmark::State& state)
+{
+    RunOnCoefficients<N, FindFast<N>>(state);
+}
+
+template <int N>
+void FindRootsPlainForm(benchmark::State& state)
+{
+    RunOnCoefficients<N, Literal::FindRoots<N>>(state);
+}
+
+BENCHMARK_TEMPLATE(FindRoots, 3);
+BENCHMARK_TEMPLATE(FindRootsPlainForm, 3);
+BENCHMARK_TEMPLATE(FindRoots, 4);
+BENCHMARK_TEMPLATE(FindRootsPlainForm, 4);
+BENCHMARK_TEMPLATE(FindRoots, 5);
+BENCHMARK_TEMPLATE(FindRootsPlainForm, 5);
+BENCHMARK_TEMPLATE(FindRoots, 9);
+BENCHMARK_TEMPLATE(FindRootsPlainForm, 9);
+BENCHMARK_TEMPLATE(FindRoots, 11);
+BENCHMARK_TEMPLATE(FindRootsPlainForm, 11);
+BENCHMARK_TEMPLATE(FindRoots, 12);
+BENCHMARK_TEMPLATE(FindRootsPlainForm, 12);
+
+#ifdef ZARNMATH_BENCH_LIB2GEOM
+
+/// The peer takes the Bernstein coefficients themselves, and so saves the conversion that `FindRoots` begins with.
+template <int N>
+void Lib2geomBezierRoots(benchmark::State& state)
+{
+    std::vector<Geom::Bezier> polynomials;
+    for (const auto& polygon : RandomPolygons<N>())
+        polynomials.emplace_back(std::vector<double>(polygon.begin(), polygon.end()));
+    std::int64_t found = 0;
+    std::size_t next = 0;
+    for (auto _ : state) {
+        const std::vector<double> roots = polynomials[next].roots();
+        found += static_cast<std::int64_t>(roots.size());
+        benchmark::DoNotOptimize(roots.data());
+        next = next + 1 < polynomials.size() ? next + 1 : 0;
+    }
+    state.counters["roots"] = benchmark::Counter(static_cast<double>(found), benchmark::Counter::kAvgIterations);
+}
+
+BENCHMARK_TEMPLATE(Lib2geomBezierRoots, 3);
+BENCHMARK_TEMPLATE(Lib2geomBezierRoots, 5);
+BENCHMARK_TEMPLATE(Lib2geomBezierRoots, 9);
+BENCHMARK_TEMPLATE(Lib2geomBezierRoots, 12);
+
+#endif
+
+} // namespace
+} // namespace ZarnMath
