@@ -68,10 +68,9 @@ void Quaternion::ForceZeros() noexcept
 
 bool Quaternion::Interpolate(const Quaternion& a, const Quaternion& b, double t, Quaternion& out) noexcept
 {
-    const Quaternion from = a;
-    const Quaternion to = b;
-    out = from;
-    const double d = from.w * to.w + ((from.x * to.x + from.y * to.y) + from.z * to.z);
+    const Quaternion to = b; // out may be b
+    out = a;
+    const double d = a.w * to.w + ((a.x * to.x + a.y * to.y) + a.z * to.z);
     if (1.0 - std::fabs(d) < shortestArc)
         return false;
     const double angle = std::acos(d);
@@ -80,8 +79,8 @@ bool Quaternion::Interpolate(const Quaternion& a, const Quaternion& b, double t,
         return false;
     const double wa = std::sin((1.0 - t) * angle);
     const double wb = std::sin(angle * t);
-    out = {(from.x * wa + to.x * wb) / s, (from.y * wa + to.y * wb) / s, (from.z * wa + to.z * wb) / s,
-           (from.w * wa + to.w * wb) / s};
+    out = {(a.x * wa + to.x * wb) / s, (a.y * wa + to.y * wb) / s, (a.z * wa + to.z * wb) / s,
+           (a.w * wa + to.w * wb) / s};
     return true;
 }
 

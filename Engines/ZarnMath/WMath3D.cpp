@@ -86,6 +86,8 @@ void MTHTranslate3DMatrix(MATRIX3D* m, int x, int y, int z) noexcept
 
 void MTHTransform3DPoints(POINT3D* points, const MATRIX3D* m, int count) noexcept
 {
+    if (count < 1)
+        return;
     const Rotation rotation = RotationOf(*m);
     const std::int32_t translation[3] = {m->m[0][3], m->m[1][3], m->m[2][3]};
     const auto image = [&](int r, float x, float y, float z) {
