@@ -32,15 +32,23 @@ const Table::Entry* Table::Find(const std::string& name) const
 Table MakeTable()
 {
     Table table;
+    AddAnglesAdapters(table);
+    AddBatchesAdapters(table);
     AddBezierToLinesAdapters(table);
     AddBoundsAdapters(table);
+    AddCircleAdapters(table);
+    AddClassificationAdapters(table);
     AddClosestPointAdapters(table);
+    AddConstructorsAdapters(table);
     AddCuttingAdapters(table);
+    AddDecompositionAdapters(table);
     AddIntervalVectorAdapters(table);
     AddLineAdapters(table);
+    AddMatrixAdapters(table);
     AddNumericAdapters(table);
     AddPlatformAdapters(table);
     AddRootFinderAdapters(table);
+    AddTransformedBoundsAdapters(table);
     AddTridiagonalMatrixAdapters(table);
     AddValueTypesAdapters(table);
     AddVectorFieldAdapters(table);
