@@ -7,6 +7,7 @@
 #include "ZarnMath/Bounds.h"
 #include "ZarnMath/Circle.h"
 #include "ZarnMath/FitLine.h"
+#include "ZarnMath/Layout.h"
 #include "ZarnMath/Line.h"
 #include "ZarnMath/Numeric.h"
 #include "ZarnMath/PlainC.h"

@@ -43,6 +43,7 @@ Table MakeTable()
     AddCuttingAdapters(table);
     AddDecompositionAdapters(table);
     AddIntervalVectorAdapters(table);
+    AddLayoutAdapters(table);
     AddLineAdapters(table);
     AddMatrixAdapters(table);
     AddNumericAdapters(table);

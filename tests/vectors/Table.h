@@ -64,6 +64,7 @@ void AddConstructorsAdapters(Table& table);
 void AddCuttingAdapters(Table& table);
 void AddDecompositionAdapters(Table& table);
 void AddIntervalVectorAdapters(Table& table);
+void AddLayoutAdapters(Table& table);
 void AddLineAdapters(Table& table);
 void AddMatrixAdapters(Table& table);
 void AddNumericAdapters(Table& table);
