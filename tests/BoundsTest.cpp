@@ -1,5 +1,7 @@
 #include "ZarnMath/Bounds.h"
 
+#include "tests/Bits.h"
+
 #include <gtest/gtest.h>
 
 #include <cstring>
@@ -12,7 +14,6 @@ namespace {
 constexpr std::int32_t smallest = -2147483647 - 1;
 constexpr std::int32_t largest = 2147483647;
 constexpr RECT empty{largest, smallest, smallest, largest};
-constexpr double nan = std::numeric_limits<double>::quiet_NaN();
 
 std::uint64_t Bits(double value)
 {
@@ -255,6 +256,9 @@ TEST(Bounds, IntersectionAsksOnlyForTheVerticalOrderAtItsEntry)
     a = {0, 5, 10, 5}; // of no height, which is still in order
     EXPECT_FALSE(IntersectRect(a, {2, 8, 5, 4}));
     EXPECT_EQ(a, (RECT{2, 5, 5, 5}));
+    a = {0, 10, 10, 0};
+    EXPECT_FALSE(IntersectRect(a, {2, 5, 8, 5}));
+    EXPECT_EQ(a, (RECT{2, 5, 8, 5}));
 }
 
 TEST(Bounds, IntersectionOfDistantRectsIsLeftInsideOut)

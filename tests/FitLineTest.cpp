@@ -102,6 +102,12 @@ TEST(FitLine, TwoPoints)
     EXPECT_NEAR(line.direction.x, 3.0, 1e-14);
 }
 
+TEST(FitLine, MixedMomentHasNoTolerance)
+{
+    const Line line = Fit({{0.0, 0.0}, {1e-9, 1e-9}, {2e-9, 2e-9}});
+    EXPECT_NEAR(line.direction.x, 1.0, 1e-12);
+}
+
 TEST(FitLine, FractionalHorizontalPointsGiveAHugeDirection)
 {
     const Line line = Fit({{0.0, 0.7}, {1.0, 0.7}, {3.0, 0.7}}); // the mixed moment rounds to 2^-51
@@ -124,7 +130,7 @@ TEST(FitLine, SumsLookAtThePointsOnlyWhereTheMixedMomentVanishes)
     Line line;
     GetLeastSquaresLines(3.0, 3.0, 5.0, 5.0, 5.0, nullptr, 3, line.point, line.direction);
     EXPECT_NEAR(line.direction.x, 1.0, 1e-15);
-    const point2d tall[2] = {{0.0, 0.0}, {1.0, 9.0}};
+    const point2d tall[3] = {{0.0, 0.0}, {1.0, 9.0}, {0.0, 0.0}};
     GetLeastSquaresLines(6.0, 15.0, 30.0, 26.0, 75.0, tall, 3, line.point, line.direction);
     EXPECT_EQ(line.point, (point2d{2.0, 5.0}));
     EXPECT_EQ(line.direction, (vector2d{0.0, 1.0}));

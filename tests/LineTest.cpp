@@ -1,5 +1,7 @@
 #include "ZarnMath/Line.h"
 
+#include "tests/Bits.h"
+
 #include <gtest/gtest.h>
 
 #include <algorithm>
@@ -11,7 +13,6 @@ namespace {
 
 constexpr std::int32_t smallest = -2147483647 - 1;
 constexpr std::int32_t largest = 2147483647;
-constexpr double nan = std::numeric_limits<double>::quiet_NaN();
 
 TEST(AreCollinear, UpToTwoPointsAreWhateverTheTolerance)
 {

@@ -6,7 +6,6 @@
 #include <cstring>
 #include <gtest/gtest.h>
 #include <random>
-#include <utility>
 
 // The library's root finder isolates first, polishes several roots side by side and works on both coordinates at once;
 // none of that may show in a single bit.
@@ -22,23 +21,6 @@ template <int N>
 class Polynomials
 {
 public:
-    using Kind = Coefficients<N> (Polynomials::*)();
-
-    static constexpr std::array<std::pair<const char*, Kind>, 12> kinds = {{
-        {"random ordinates", &Polynomials::RandomOrdinates},
-        {"whole ordinates", &Polynomials::WholeOrdinates},
-        {"ordinates of any magnitude", &Polynomials::AnyMagnitude},
-        {"tiny ordinates", &Polynomials::TinyOrdinates},
-        {"zeros and products that underflow", &Polynomials::ZerosAndUnderflow},
-        {"a sign change at every leg", &Polynomials::EveryLegCrosses},
-        {"NaN and infinities", &Polynomials::NotFinite},
-        {"any bits at all", &Polynomials::AnyBits},
-        {"planted roots, on cuts and multiple", &Polynomials::PlantedRoots},
-        {"squares, all roots double", &Polynomials::Squares},
-        {"vanishing ends", &Polynomials::VanishingEnds},
-        {"close pairs of roots", &Polynomials::ClosePairs},
-    }};
-
     Coefficients<N> RandomOrdinates()
     {
         return FromOrdinates([this] { return Uniform(); });
@@ -183,6 +165,29 @@ private:
     std::mt19937_64 engine{20240229 + N};
 };
 
+template <int N>
+struct Kind
+{
+    const char* name;
+    Coefficients<N> (Polynomials<N>::*draw)();
+};
+
+template <int N>
+constexpr std::array<Kind<N>, 12> kinds = {{
+    {"random ordinates", &Polynomials<N>::RandomOrdinates},
+    {"whole ordinates", &Polynomials<N>::WholeOrdinates},
+    {"ordinates of any magnitude", &Polynomials<N>::AnyMagnitude},
+    {"tiny ordinates", &Polynomials<N>::TinyOrdinates},
+    {"zeros and products that underflow", &Polynomials<N>::ZerosAndUnderflow},
+    {"a sign change at every leg", &Polynomials<N>::EveryLegCrosses},
+    {"NaN and infinities", &Polynomials<N>::NotFinite},
+    {"any bits at all", &Polynomials<N>::AnyBits},
+    {"planted roots, on cuts and multiple", &Polynomials<N>::PlantedRoots},
+    {"squares, all roots double", &Polynomials<N>::Squares},
+    {"vanishing ends", &Polynomials<N>::VanishingEnds},
+    {"close pairs of roots", &Polynomials<N>::ClosePairs},
+}};
+
 template <typename Degree>
 class RootFinderAgainstLiteral : public testing::Test
 {};
@@ -208,9 +213,9 @@ TYPED_TEST(RootFinderAgainstLiteral, GivesTheSameBits)
     constexpr int N = TypeParam::value;
     constexpr int casesOfAKind = 900; // 108,000 polynomials over all kinds and degrees
     Polynomials<N> polynomials;
-    for (const auto& [name, kind] : Polynomials<N>::kinds) {
+    for (const auto& [name, draw] : kinds<N>) {
         for (int i = 0; i < casesOfAKind; ++i) {
-            const Coefficients<N> c = (polynomials.*kind)();
+            const Coefficients<N> c = (polynomials.*draw)();
             const bool includeEndpoints = polynomials.Coin();
             auto expected = Untouched<N>();
             auto actual = expected;

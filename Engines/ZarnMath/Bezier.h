@@ -28,6 +28,22 @@ enum Side : std::int32_t
     SideNegative = 2, ///< to the right
 };
 
+/// How exactly a length is taken: the number of points at which the speed is sampled.
+///
+/// Any `int` can be cast to it: below 2 counts as 2, 9 as 10, and above 10 as 16.
+enum class LengthAccuracy : int
+{
+    Order2 = 2,
+    Order3 = 3,
+    Order4 = 4,
+    Order5 = 5,
+    Order6 = 6,
+    Order7 = 7,
+    Order8 = 8,
+    Order10 = 10,
+    Order16 = 16,
+};
+
 } // namespace ZarnMath
 
 namespace ZarnMath::CubicBezier {
@@ -113,6 +129,177 @@ ZARNMATH_API void RightOf(double t, const POINT* in, POINT* out) noexcept;
 /// @param[out] out four control points
 ZARNMATH_API void Subsection(double t0, double t1, const point2d* in, point2d* out) noexcept;
 ZARNMATH_API void Subsection(double t0, double t1, const POINT* in, POINT* out) noexcept;
+
+/// @}
+/// @name Construction
+/// Cubics through given points, rounded to whole units, as for a curve that is dragged by a point on it.
+/// @{
+
+/// A quadratic arc by three points, raised to a cubic.
+///
+/// Its control point Q is one of two:
+/// - *simple*: through + (through - (start + end)/2), so that the arc runs through `through` at t = 0.5;
+/// - otherwise on the outer bisector of the corner at `through`, as far from it as the geometric mean of the distances of
+///   start and end from the line through it that is square to the bisector. This makes a pleasant arc near `through`,
+///   and not in general through it. Where start, `through` and end follow each other on a straight line, so that there is
+///   no bisector, Q is `through` itself.
+///
+/// @param[out] out            four control points: the rounded start, start + 2/3*(Q - start), Q + 1/3*(end - Q) and end
+/// @param start, through, end the points, in curve order
+/// @param simple              asks for the simple arc, which is taken anyway where `through` or end coincides with start
+ZARNMATH_API void From3Points(POINT* out, const point2d& start, const point2d& through, const point2d& end,
+                              bool simple) noexcept;
+
+/// The cubic with given end tangents that runs through a point at t = 0.5.
+///
+/// Its inner control points are start + startTangent*alpha and end + endTangent*beta. A tangent gives a line, not a
+/// direction: alpha and beta may come out negative.
+///
+/// @param[out] out              four control points, rounded
+/// @param start, through, end   the points, in curve order
+/// @param startTangent          the line of the tangent at start, of any length
+/// @param endTangent            the line of the tangent at end, of any length
+/// @return false, with `out` untouched, where |Cross(startTangent, endTangent)| <= DBL_EPSILON: the tangents are parallel,
+///         or too short
+ZARNMATH_API bool From3Points(POINT* out, const point2d& start, const vector2d& startTangent, const point2d& through,
+                              const point2d& end, const vector2d& endTangent) noexcept;
+
+/// @}
+/// @name Curvature
+/// Curvature is signed: Cross(P', P'')/|P'|^3, positive where the curve turns to the left, that is counter-clockwise. Its
+/// radius, the reciprocal, has the same sign. Both are undefined at a cusp, where P' vanishes.
+///
+/// The `Safe` functions give a usable value at a cusp and at coincident control points too.
+/// @{
+
+/// The curvature at a parameter.
+///
+/// @param t              parameter
+/// @param a, b, c        power form
+/// @param[out] curvature in reciprocal drawing units
+/// @return false, with `curvature` untouched, where |P'(t)|^3 is not above 0. There is no tolerance, but the cube of a
+///         speed below about 1e-108 underflows to 0
+ZARNMATH_API bool GetCurvatureAt(double t, const point2d& a, const point2d& b, const point2d& c,
+                                 double& curvature) noexcept;
+
+/// The radius of curvature at a parameter.
+///
+/// @param t           parameter
+/// @param a, b, c     power form
+/// @param[out] radius in drawing units; the largest double where the curve is straight or has a cusp
+/// @return false where Cross(P', P'') is exactly 0
+ZARNMATH_API bool GetCurvatureRadiusAt(double t, const point2d& a, const point2d& b, const point2d& c,
+                                       double& radius) noexcept;
+
+/// The curvature at a parameter, or near it.
+///
+/// @param t       parameter
+/// @param a, b, c power form
+/// @return the curvature at t; where it is undefined, that at t + 1e-05 for t <= 0.5 and at t - 1e-05 beyond, toward the
+///         middle of the curve; and 0.0 where that is undefined too
+[[nodiscard]] ZARNMATH_API double SafeBezierCurvature(double t, const point2d& a, const point2d& b,
+                                                      const point2d& c) noexcept;
+
+/// The two parameters at which Cross(P', P'') vanishes, where the curvature changes sign.
+///
+/// Nothing is filtered: the values are not sorted, may lie outside [0, 1], and are equal for a double root. Where the
+/// quadratic has no quadratic term they are infinite or NaN.
+///
+/// @param a, b, c  power form
+/// @param[out] out two values
+/// @return 2; or 0, with `out` untouched, where the discriminant is negative
+ZARNMATH_API int BezierInflectionPoints(const point2d& a, const point2d& b, const point2d& c, double* out) noexcept;
+
+/// The parameters in (0, 1) at which the derivative of |P'|^6 vanishes, where the speed is extreme.
+///
+/// On a curve as it is commonly drawn these lie near its sharpest and its flattest points; curvature itself does not
+/// enter. A zero of the speed is a double root of that polynomial, of degree 11, and may be listed once, twice or not at
+/// all.
+///
+/// @param a, b, c  power form
+/// @param[out] out room for 11 values, of which the count is written, in the root finder's order
+/// @return the number of parameters
+ZARNMATH_API int FindCurvatureMinMax(const point2d& a, const point2d& b, const point2d& c, double* out) noexcept;
+
+/// The direction in which a cubic runs at a parameter.
+///
+/// The first of these that is long enough, its squared length at least DBL_EPSILON: the derivative; the chord over a step
+/// of 1e-05 toward the middle of the curve; and, whatever its length, the chord from 1e-06 to 0.999999. At the start of a
+/// curve with P1 = P0, the second step serves only control polygons of about 50 units or more; below that it is the
+/// direction of the whole curve.
+///
+/// @param t          parameter
+/// @param a, b, c, d power form
+/// @return the direction, of no meaningful length; (1, 0) for a curve whose last chord is exactly zero
+[[nodiscard]] ZARNMATH_API vector2d SafeBezierTangent(double t, const point2d& a, const point2d& b, const point2d& c,
+                                                      const point2d& d) noexcept;
+
+/// @}
+/// @name Length
+/// Arc length by one pass of Gauss-Legendre quadrature of the speed, without control of the error. The nodes and weights
+/// are kept short, most of them at eight decimal places: at orders 5, 6 and 10 a straight unit segment is off by 1e-08
+/// already. A curve with a sharp turn between samples is off by far more.
+///
+/// The squared speed is evaluated as a quartic: where it all but vanishes, rounding can take it below zero, and the length
+/// is then NaN.
+/// @{
+
+/// The length of a stretch.
+///
+/// @param a, b, c power form
+/// @param order   number of samples: below 2 counts as 2, 9 as 10, above 10 as 16
+/// @param t0, t1  the stretch; beyond [0, 1] that of the extended polynomial
+/// @return the length, negative for t1 < t0
+[[nodiscard]] ZARNMATH_API double Length(const point2d& a, const point2d& b, const point2d& c, int order, double t0,
+                                         double t1) noexcept;
+
+/// The length from 0 to 1.
+///
+/// @param a, b, c  power form
+/// @param accuracy number of samples
+/// @return the length
+[[nodiscard]] ZARNMATH_API double Length(const point2d& a, const point2d& b, const point2d& c,
+                                         LengthAccuracy accuracy) noexcept;
+
+/// The length from 0 to 1; for `point2d`.
+///
+/// @param curve    four control points
+/// @param accuracy number of samples
+/// @return the length
+template <typename P>
+[[nodiscard]] double Length(const P* curve, LengthAccuracy accuracy) noexcept;
+
+extern template ZARNMATH_API double Length<point2d>(const point2d*, LengthAccuracy) noexcept;
+
+/// The length from 0 to t, of the piece that `LeftOf` cuts, with ten samples.
+///
+/// @param t     parameter; outside [0, 1] the piece is extrapolated
+/// @param curve four control points; the piece of an integer curve is not rounded
+/// @return the length, exactly 0.0 for t = 0
+[[nodiscard]] ZARNMATH_API double LengthTo(double t, const point2d* curve) noexcept;
+[[nodiscard]] ZARNMATH_API double LengthTo(double t, const POINT* curve) noexcept;
+
+/// The length from t to 1, of the piece that `RightOf` cuts, with ten samples.
+///
+/// @param t     parameter; outside [0, 1] the piece is extrapolated
+/// @param curve four control points; the piece of an integer curve is not rounded
+/// @return the length, exactly 0.0 for t = 1
+[[nodiscard]] ZARNMATH_API double LengthFrom(double t, const point2d* curve) noexcept;
+[[nodiscard]] ZARNMATH_API double LengthFrom(double t, const POINT* curve) noexcept;
+
+/// The parameter up to which a cubic has a given fraction of its length.
+///
+/// A bracketed false position, whose first pass bisects and whose others move by at least 1e-04 of the bracket, from
+/// either end of it. Each pass takes the length from 0 anew.
+///
+/// @param fraction  of the length from 0 to 1; at most 0 gives 0.0, at least 1 gives 1.0
+/// @param a, b, c   power form
+/// @param tolerance the search ends once the length is off by no more, in drawing units, or an end of the bracket is
+///                  within DBL_EPSILON. After 200 passes it ends as well, and with a tolerance of 0 usually so
+/// @param accuracy  number of samples
+/// @return the parameter; 0.5 for a curve of no length
+[[nodiscard]] ZARNMATH_API double GetCurveRelativeLengthParameter(double fraction, point2d a, point2d b, point2d c,
+                                                                  double tolerance, LengthAccuracy accuracy) noexcept;
 
 /// @}
 /// @name Closest point and side
@@ -214,6 +401,220 @@ ZARNMATH_API bool Invert(const point2d& a, const point2d& b, const point2d& c, c
 /// @return the number of parameters
 ZARNMATH_API int FindTangentsToPoint(const point2d& a, const point2d& b, const point2d& c, const point2d& d,
                                      const point2d& q, double* parameters) noexcept;
+
+/// @}
+/// @name Implicit form
+/// @{
+
+/// The cubic polynomial of x and y that vanishes on the curve, by the Bezout resultant with respect to t (Sederberg,
+/// 1983):
+///
+/// f(x, y) = Kxxx*x^3 + Kyyy*y^3 + Kxxy*x^2*y + Kxyy*x*y^2 + Kxx*x^2 + Kyy*y^2 + Kxy*x*y + Kx*x + Ky*y + K1
+///
+/// f(P(t)) = 0 for all real t, outside [0, 1] too. f is the determinant itself, whose sign tells the two sides of the
+/// curve apart. It is the zero polynomial where a = (0, 0), for a parabola therefore, and the negative cube of a line's
+/// equation where a, b and c are parallel.
+///
+/// @param a, b, c, d power form
+/// @param[out] Kxxx, Kyyy, Kxxy, Kxyy, Kxx, Kyy, Kxy, Kx, Ky, K1 the coefficients, both pure cubes first
+ZARNMATH_API void ConvertBezierToImplicit(const point2d& a, const point2d& b, const point2d& c, const point2d& d,
+                                          double& Kxxx, double& Kyyy, double& Kxxy, double& Kxyy, double& Kxx,
+                                          double& Kyy, double& Kxy, double& Kx, double& Ky, double& K1) noexcept;
+
+/// @}
+/// @name Intersection
+/// @{
+
+/// The points at which two cubics cross.
+///
+/// One of the curves is made implicit and the other substituted, which leaves a polynomial of degree 9 in the parameter
+/// of the second (Sederberg and Parry, 1986). Each root in (0, 1) is kept where the point lies within 0.1 units of the
+/// first curve's segment. Before that, a curve whose control points lie within 2 units of a straight line is taken for
+/// its chord, the first one before the second; crossings are then accepted within 2 units of the curve. These lengths
+/// are absolute: a curve of a few units always counts as straight.
+///
+/// Nothing is found where the curves
+/// - share an end point only, since the range of the parameters is open;
+/// - touch without crossing;
+/// - overlap, and lie on one algebraic curve or on one line;
+/// - both have no cubic term (a = (0, 0)), as two parabolas.
+///
+/// @param first, second            four control points each
+/// @param[in,out] firstParameters  parameters on the first curve
+/// @param[in,out] secondParameters parameters on the second curve
+/// @param[in,out] points           the points, on the curve that was substituted
+///
+/// The three vectors are parallel and hold at most nine crossings more than before, in the root finder's order, neither
+/// sorted nor made unique. Pass empty ones: crossings with a straight curve are appended, all others replace what the
+/// vectors held.
+ZARNMATH_API void FindBezierIntersections(const point2d* first, const point2d* second,
+                                          std::vector<double>& firstParameters, std::vector<double>& secondParameters,
+                                          std::vector<point2d>& points);
+ZARNMATH_API void FindBezierIntersections(const POINT* first, const POINT* second, std::vector<double>& firstParameters,
+                                          std::vector<double>& secondParameters, std::vector<point2d>& points);
+
+/// @}
+/// @name Lines
+/// The curve substituted into the line's equation, a cubic in t. A curve that lies along the line crosses it nowhere.
+/// @{
+
+/// The points at which a cubic crosses the infinite line through two points.
+///
+/// @param bezier                four control points
+/// @param line                  two points, at which the line's parameter is 0 and 1
+/// @param[out] bezierParameters parameters on the curve, at most four, in the root finder's order
+/// @param[out] lineParameters   parameters along the line, element for element; any real number
+/// @param includeEndpoints      whether t = 0 and t = 1 of the curve count. Even then t = 0 is dropped where the curve
+///                              crosses twice besides
+/// @return whether anything was found. Both vectors are cleared first, and stay empty where the two points of the line
+///         are exactly equal.
+ZARNMATH_API bool FindBezierLineIntersection(const point2d* bezier, const point2d* line,
+                                             std::vector<double>& bezierParameters, std::vector<double>& lineParameters,
+                                             bool includeEndpoints);
+ZARNMATH_API bool FindBezierLineIntersection(const POINT* bezier, const POINT* line,
+                                             std::vector<double>& bezierParameters, std::vector<double>& lineParameters,
+                                             bool includeEndpoints);
+
+/// The parameters at which a cubic has a given x.
+///
+/// @param bezier             four control points
+/// @param x                  where the vertical line stands
+/// @param[in,out] parameters the parameters are appended, at most four, in the root finder's order
+/// @param includeEndpoints   whether t = 0 and t = 1 count
+/// @return whether `parameters` is not empty afterwards: true as well where it was not empty before
+ZARNMATH_API bool FindBezierIntersectionsAtX(const point2d* bezier, double x, std::vector<double>& parameters,
+                                             bool includeEndpoints);
+
+/// Whether a cubic crosses a segment. An end of the segment on the curve counts, an end of the curve on the segment
+/// does not.
+///
+/// @param bezier four control points
+/// @param line   the two ends of the segment
+/// @return whether there is a crossing with t in (0, 1) and u in [0, 1]; false for a segment without length
+[[nodiscard]] ZARNMATH_API bool DoesBezierIntersectLineSegment(const point2d* bezier, const point2d* line) noexcept;
+[[nodiscard]] ZARNMATH_API bool DoesBezierIntersectLineSegment(const POINT* bezier, const POINT* line) noexcept;
+
+/// @}
+/// @name Self-intersection and fast predicates
+/// @{
+
+/// Whether a cubic has a loop, in closed form, and about where it crosses itself.
+///
+/// A cubic without real inflections has a loop somewhere (Stone and DeRose, 1989). The two passes of the crossing are
+/// bracketed by tangency: the later pass by the parameters at which the tangent runs through P0, the earlier one by
+/// those of P3 on the reversed curve.
+///
+/// @param bezier                      four control points
+/// @param[out] lateStart, lateEnd     the stretch of the later pass, ascending, within [0, 1]
+/// @param[out] earlyStart, earlyEnd   the stretch of the earlier pass, likewise
+/// @param allowClosed                 whether a curve whose ends coincide counts as crossing itself there
+/// @return whether the curve crosses itself. If not, the four results may have been written, or not, and mean nothing.
+ZARNMATH_API bool DoesBezierSelfIntersect(const point2d* bezier, double& lateStart, double& lateEnd, double& earlyStart,
+                                          double& earlyEnd, bool allowClosed) noexcept;
+ZARNMATH_API bool DoesBezierSelfIntersect(const POINT* bezier, double& lateStart, double& lateEnd, double& earlyStart,
+                                          double& earlyEnd, bool allowClosed) noexcept;
+
+/// The point at which a cubic crosses itself.
+///
+/// The two stretches of `DoesBezierSelfIntersect` are halved against each other. Stretches below one unit are given up,
+/// so that a small loop, such as (0, 0), (30, 30), (-10, 30), (20, 0), is not found.
+///
+/// @param bezier      four control points
+/// @param[out] first  parameter of the later pass
+/// @param[out] second parameter of the earlier pass
+/// @param[out] point  the crossing
+/// @return whether it was found. If not, the results may have been written, and mean nothing. Where one of the
+///         stretches is a point, the crossing is at an end of the curve, and first is the smaller parameter: 0 and 1
+///         for a closed curve.
+ZARNMATH_API bool FindBezierSelfIntersection(const point2d* bezier, double& first, double& second,
+                                             point2d& point) noexcept;
+ZARNMATH_API bool FindBezierSelfIntersection(const POINT* bezier, double& first, double& second,
+                                             point2d& point) noexcept;
+
+/// Whether two cubics meet: share an end point exactly, or cross as `FindBezierIntersections` sees it.
+///
+/// @param one, other four control points each
+[[nodiscard]] ZARNMATH_API bool DoBeziersIntersect(const point2d* one, const point2d* other);
+[[nodiscard]] ZARNMATH_API bool DoBeziersIntersect(const POINT* one, const POINT* other);
+
+/// Whether a cubic comes within a distance of a segment, strictly, by cheap tests first.
+///
+/// One end of the segment has to lie in the box of the control points grown by the distance: a segment that runs right
+/// through the curve with both ends outside gets false. The closest approach to the interior of the segment is not
+/// sought, only that of the two ends of the curve, and the crossing itself.
+///
+/// @param bezier             four control points
+/// @param lineStart, lineEnd the segment, which may be without length
+/// @param halfWidth          the distance
+[[nodiscard]] ZARNMATH_API bool DoesFatlineIntersectBezier(const point2d* bezier, const point2d& lineStart,
+                                                           const point2d& lineEnd, double halfWidth) noexcept;
+
+/// @}
+/// @name Directions and extents
+/// Where the tangent has a given direction, as the roots of a quadratic: its leading coefficient counts as zero up to
+/// 1e-9, so that a root far outside the segment, and on tiny curves one inside it, is lost.
+/// @{
+
+/// The parameters in (0, 1) at which the tangent is vertical, where x has an extreme.
+///
+/// @param a, b, c            power form
+/// @param[in,out] parameters at most two are appended, in ascending order. The ends of the curve are never among them, and
+///                           nothing is for a vertical straight curve
+ZARNMATH_API void GetVerticalTangents(const point2d& a, const point2d& b, const point2d& c,
+                                      std::vector<double>& parameters);
+
+/// The parameters in (0, 1) at which the tangent is horizontal, where y has an extreme.
+///
+/// @param a, b, c            power form
+/// @param[in,out] parameters at most two are appended, in ascending order. The ends of the curve are never among them, and
+///                           nothing is for a horizontal straight curve
+ZARNMATH_API void GetHorizontalTangents(const point2d& a, const point2d& b, const point2d& c,
+                                        std::vector<double>& parameters);
+
+/// The parameters in [0, 1] at which the tangent is parallel to a direction, either way along it.
+///
+/// @param a, b, c            power form
+/// @param direction          the direction, of any length. The zero vector is parallel to everything
+/// @param[in,out] parameters at most two are appended, in ascending order; a double root at 0 is appended twice
+/// @param[out] allParallel   whether the tangent is parallel to the direction everywhere, each coefficient of the quadratic
+///                           being at most DBL_EPSILON; nothing is appended then
+ZARNMATH_API void GetParallels(const point2d& a, const point2d& b, const point2d& c, const vector2d& direction,
+                               std::vector<double>& parameters, bool& allParallel);
+
+/// The signed area between a cubic and the x axis, the exact integral of y dx from t = 0 to t = 1.
+///
+/// Positive where the curve runs above the axis with x increasing. The sum over a closed outline is the area that it
+/// encloses, positive for a clockwise one.
+///
+/// @param a, b, c, d power form
+/// @return the area, in drawing units squared
+[[nodiscard]] ZARNMATH_API double GetAreaUnderBezier(const point2d& a, const point2d& b, const point2d& c,
+                                                     const point2d& d) noexcept;
+
+/// The point at a distance from a cubic, square to its direction.
+///
+/// @param bezier        four control points
+/// @param t             parameter; outside [0, 1] the curve is extrapolated
+/// @param offset, scale the product is the distance, positive to the left of the direction of travel
+/// @return P(t) + offset*scale*Perpendicular(n), with n the normalised `SafeBezierTangent`. Where that is too short to be
+///         normalised, the point lies nearer
+[[nodiscard]] ZARNMATH_API point2d MapToBezier(const point2d* bezier, double t, double offset, double scale) noexcept;
+
+/// @}
+/// @name Offset cusps
+/// The offset of a cubic by a signed distance, P(t) + distance*n(t) with n the left normal, turns back on itself where the
+/// radius of curvature equals the distance.
+/// @{
+
+/// The parameters in (0, 1) at which the offset of a cubic has a cusp.
+///
+/// @param a, b, c         power form
+/// @param distance        positive to the left of the direction of travel; 0 has no cusps
+/// @param[out] parameters cleared, then filled in the root finder's order, with at most 12 values
+/// @return whether there is any. A double root, where the radius only touches the distance, may be listed once, twice or
+///         not at all, and so may a zero of the speed, which counts for positive distances
+ZARNMATH_API bool FindOffsetCusps(const point2d& a, const point2d& b, const point2d& c, double distance,
+                                  std::vector<double>& parameters);
 
 /// @}
 

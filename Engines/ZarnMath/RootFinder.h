@@ -14,6 +14,7 @@
 #include "ZarnMath/Bezier/Pair.h"
 
 #include <bit>
+#include <initializer_list>
 
 namespace ZarnMath::RootFinder {
 
@@ -255,6 +256,53 @@ template <int N>
     return orStart(t);
 }
 
+/// The roots of c[0]*t^2 + c[1]*t + c[2] on the unit interval in closed form, in ascending order.
+///
+/// Up to |c[0]| = 1e-09 the polynomial counts as linear: an absolute limit, where the higher degrees ask for an exact
+/// zero. A double root counts once. A root at 0 comes first, and where c[1] = 0 as well it comes twice.
+///
+/// @param c                three coefficients
+/// @param[out] roots       room for two values. A linear polynomial, a double root, and c[2] = 0 without the ends leave
+///                         their single candidate in roots[0], even where it is out of range
+/// @param includeEndpoints whether t = 0 and t = 1 count
+/// @return the number of roots
+[[nodiscard]] inline int FindQuadraticRoots(const double* c, double* roots, bool includeEndpoints) noexcept
+{
+    constexpr double linearLimit = 1e-09;
+    const auto isInside = [includeEndpoints](double r) {
+        return includeEndpoints ? 0.0 <= r && r <= 1.0 : 0.0 < r && r < 1.0;
+    };
+    const auto storeSingle = [&isInside, roots](double r) {
+        roots[0] = r;
+        return isInside(r) ? 1 : 0;
+    };
+    if (std::fabs(c[0]) <= linearLimit)
+        return c[1] == 0.0 ? 0 : storeSingle(-c[2] / c[1]);
+    if (c[2] == 0.0) {
+        const double r = -c[1] / c[0];
+        if (!includeEndpoints)
+            return storeSingle(r);
+        roots[0] = 0.0;
+        if (!isInside(r))
+            return 1;
+        roots[1] = r;
+        return 2;
+    }
+    const double p = c[1] / c[0] * 0.5;
+    const double q = c[2] / c[0];
+    const double discriminant = p * p - q;
+    if (discriminant == 0.0)
+        return storeSingle(-p);
+    if (discriminant < 0.0)
+        return 0;
+    const double s = std::sqrt(discriminant);
+    int count = 0;
+    for (const double r : {-s - p, s - p}) // s >= 0: ascending
+        if (isInside(r))
+            roots[count++] = r;
+    return count;
+}
+
 /// The roots of a polynomial, from a stretch of its control polygon on; for N from 3 to 12.
 ///
 /// @param bez            N + 1 points
@@ -282,9 +330,7 @@ void SolvePolynomial_BezierDivide_NewtonsMethod(const vector2d* bez, const doubl
 template <int N>
 int FindRoots(const double* c, double* roots, bool includeEndpoints) noexcept;
 
-template <>
-int FindRoots<2>(const double* c, double* roots, bool includeEndpoints) noexcept;
-
+extern template int FindRoots<2>(const double*, double*, bool) noexcept;
 extern template int FindRoots<3>(const double*, double*, bool) noexcept;
 extern template int FindRoots<4>(const double*, double*, bool) noexcept;
 extern template int FindRoots<5>(const double*, double*, bool) noexcept;

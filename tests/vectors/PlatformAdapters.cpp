@@ -15,8 +15,8 @@ double Opaque(double v)
 
 void AddUnary(Table& table, Platform function, double (*call)(double))
 {
-    table.Add(
-        NameOf(function), [call](Input& in, Output& out) { out.Add(call(Opaque(in.Get<double>()))); }, {function});
+    table.Add(NameOf(function), [call](Input& in, Output& out) { out.Add(call(Opaque(in.Get<double>()))); },
+              {function});
 }
 
 void AddBinary(Table& table, Platform function, double (*call)(double, double))

@@ -44,6 +44,11 @@ Table MakeTable()
     AddDecompositionAdapters(table);
     AddIntervalVectorAdapters(table);
     AddLayoutAdapters(table);
+    AddCurvatureAdapters(table);
+    AddCuttingAdapters(table);
+    AddExtentsAdapters(table);
+    AddLengthAdapters(table);
+    AddIntersectionAdapters(table);
     AddLineAdapters(table);
     AddMatrixAdapters(table);
     AddNumericAdapters(table);
@@ -51,6 +56,7 @@ Table MakeTable()
     AddRootFinderAdapters(table);
     AddTransformedBoundsAdapters(table);
     AddTridiagonalMatrixAdapters(table);
+    AddSelfIntersectionAdapters(table);
     AddValueTypesAdapters(table);
     AddVectorFieldAdapters(table);
     AddWMath3DAdapters(table);

@@ -12,7 +12,18 @@
 namespace ZarnMath::Vectors {
 
 /// The functions of the platform's mathematical library that are not rounded the same everywhere.
-enum class Platform { Sin, Cos, Tan, Atan, Atan2, Acos, Exp, Log, Pow };
+enum class Platform
+{
+    Sin,
+    Cos,
+    Tan,
+    Atan,
+    Atan2,
+    Acos,
+    Exp,
+    Log,
+    Pow
+};
 
 /// The name of the function in a file.
 std::string NameOf(Platform function);
@@ -65,6 +76,11 @@ void AddCuttingAdapters(Table& table);
 void AddDecompositionAdapters(Table& table);
 void AddIntervalVectorAdapters(Table& table);
 void AddLayoutAdapters(Table& table);
+void AddCurvatureAdapters(Table& table);
+void AddCuttingAdapters(Table& table);
+void AddExtentsAdapters(Table& table);
+void AddLengthAdapters(Table& table);
+void AddIntersectionAdapters(Table& table);
 void AddLineAdapters(Table& table);
 void AddMatrixAdapters(Table& table);
 void AddNumericAdapters(Table& table);
@@ -72,6 +88,7 @@ void AddPlatformAdapters(Table& table);
 void AddRootFinderAdapters(Table& table);
 void AddTransformedBoundsAdapters(Table& table);
 void AddTridiagonalMatrixAdapters(Table& table);
+void AddSelfIntersectionAdapters(Table& table);
 void AddValueTypesAdapters(Table& table);
 void AddVectorFieldAdapters(Table& table);
 void AddWMath3DAdapters(Table& table);

@@ -124,8 +124,8 @@ bool AreWithinUnits(const Value& expected, const Value& actual, int units, doubl
     if (!IsFloating(expected))
         return std::fabs(a) > 1.0 && std::fabs(a - b) <= 1.0;
     const bool isFloat = expected.kind == Value::Kind::Float;
-    const double unit = isFloat ? static_cast<double>(std::numeric_limits<float>::epsilon())
-                                : std::numeric_limits<double>::epsilon();
+    const double unit =
+        isFloat ? static_cast<double>(std::numeric_limits<float>::epsilon()) : std::numeric_limits<double>::epsilon();
     return a == b || std::fabs(a - b) <= units * unit * scale;
 }
 

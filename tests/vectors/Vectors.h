@@ -24,7 +24,13 @@ namespace ZarnMath::Vectors {
 /// One recorded value, by its type and bits.
 struct Value
 {
-    enum class Kind { Double, Float, Integer, AnyNaN };
+    enum class Kind
+    {
+        Double,
+        Float,
+        Integer,
+        AnyNaN
+    };
 
     Kind kind;
     std::uint64_t bits; ///< of a `Float` the lower half; of an `Integer` its two's complement; of `AnyNaN` nothing
@@ -61,8 +67,8 @@ Value ToValue(double v);
 Value ToValue(float v);
 
 template <typename T>
-    requires std::is_integral_v<T>
-Value ToValue(T v)
+
+requires std::is_integral_v<T> Value ToValue(T v)
 {
     if constexpr (std::is_signed_v<T>)
         return {Value::Kind::Integer, static_cast<std::uint64_t>(static_cast<std::int64_t>(v))};
@@ -142,7 +148,8 @@ void Read(Input& in, bool& v);
 
 /// An integer or an enumeration; throws where the recorded integer is out of its range.
 template <typename T>
-    requires std::is_integral_v<T> || std::is_enum_v<T>
+requires std::is_integral_v<T> || std::is_enum_v<T>
+
 void Read(Input& in, T& v)
 {
     if constexpr (std::is_enum_v<T>) {
@@ -227,7 +234,8 @@ private:
 
 /// A number, a truth value or an enumeration.
 template <typename T>
-    requires std::is_arithmetic_v<T> || std::is_enum_v<T>
+requires std::is_arithmetic_v<T> || std::is_enum_v<T>
+
 void Write(Output& out, const T& v)
 {
     if constexpr (std::is_enum_v<T>)

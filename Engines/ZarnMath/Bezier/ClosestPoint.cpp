@@ -1,3 +1,4 @@
+#include "ZarnMath/Bezier/Polynomial.h"
 #include "ZarnMath/Bezier/PowerForm.h"
 #include "ZarnMath/BezierInternal.h"
 #include "ZarnMath/RootFinder.h"
@@ -5,13 +6,6 @@
 namespace ZarnMath::CubicBezier {
 
 namespace {
-
-/// A polynomial of degree N, highest power first.
-template <int N>
-struct Polynomial
-{
-    double c[N + 1];
-};
 
 /// Half the derivative of |P(t) - q|^2, Dot(P(t) - q, P'(t)).
 Polynomial<5> DistancePolynomial(const PowerForm& f, const point2d& q) noexcept
@@ -198,13 +192,24 @@ Side GetSide(const point2d& a, const point2d& b, const point2d& c, const point2d
 }
 
 bool Invert(const point2d& a, const point2d& b, const point2d& c, const point2d& d, const point2d& q,
-            std::vector<double>& parameters)
+            double& parameter) noexcept
 {
     double t = 0.0;
     point2d point{};
     double distanceSquared = 0.0;
-    if (FindClosestPointOnBezierExtendedRange(a, b, c, d, q, t, point, distanceSquared) && 0.0 <= t && t <= 1.0 &&
-        distanceSquared < 0.01)
+    if (!FindClosestPointOnBezierExtendedRange(a, b, c, d, q, t, point, distanceSquared))
+        return false;
+    if (!(0.0 <= t && t <= 1.0 && distanceSquared < 0.01))
+        return false;
+    parameter = t;
+    return true;
+}
+
+bool Invert(const point2d& a, const point2d& b, const point2d& c, const point2d& d, const point2d& q,
+            std::vector<double>& parameters)
+{
+    double t = 0.0;
+    if (Invert(a, b, c, d, q, t))
         parameters.push_back(t);
     return !parameters.empty();
 }

@@ -1,6 +1,6 @@
 /// @file
 /// The power form of a cubic, P(t) = a*t^3 + b*t^2 + c*t + d: the one conversion and the one evaluation that all of the
-/// library shares. Internal.
+/// library shares, and those of its derivatives. Internal.
 #pragma once
 
 #include "ZarnMath/ValueTypesInternal.h"
@@ -47,10 +47,31 @@ template <typename P>
     return Evaluate(f.a, f.b, f.c, f.d, t);
 }
 
+/// The coefficients of P'(t) = u*t^2 + v*t + w.
+struct DerivativeForm
+{
+    vector2d u;
+    vector2d v;
+    vector2d w;
+};
+
+/// u = 3a, v = b + b, w = c.
+[[nodiscard]] constexpr DerivativeForm ToDerivativeForm(const point2d& a, const point2d& b, const point2d& c) noexcept
+{
+    return {AsVector(a) * 3.0, AsVector(b) + AsVector(b), AsVector(c)};
+}
+
 /// P'(t), as (3a*t + 2b)*t + c with 2b as b + b. Sums commute to the bit, so this is c + (3a*t + 2b)*t as well.
 [[nodiscard]] constexpr vector2d Derivative(const point2d& a, const point2d& b, const point2d& c, double t) noexcept
 {
-    return {(a.x * 3.0 * t + (b.x + b.x)) * t + c.x, (a.y * 3.0 * t + (b.y + b.y)) * t + c.y};
+    const auto [u, v, w] = ToDerivativeForm(a, b, c);
+    return (u * t + v) * t + w;
+}
+
+/// P''(t), as 6a*t + 2b with 2b as b + b.
+[[nodiscard]] constexpr vector2d SecondDerivative(const point2d& a, const point2d& b, double t) noexcept
+{
+    return AsVector(a) * 6.0 * t + (AsVector(b) + AsVector(b));
 }
 
 } // namespace ZarnMath::CubicBezier

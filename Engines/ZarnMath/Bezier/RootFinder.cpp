@@ -11,9 +11,6 @@ namespace {
 /// Below this width two sign changes are taken for a double root.
 constexpr double sliverWidth = 2e-07;
 
-/// The leading coefficient up to which a quadratic counts as linear.
-constexpr double linearTolerance = 1e-09;
-
 [[nodiscard]] bool HasAtMostOneBit(unsigned bits) noexcept
 {
     return (bits & (bits - 1)) == 0;
@@ -162,24 +159,6 @@ template <int N>
     return count + 1;
 }
 
-/// The unit interval, with or without its ends.
-struct UnitInterval
-{
-    bool includesEnds;
-
-    [[nodiscard]] bool Holds(double r) const noexcept
-    {
-        return includesEnds ? 0.0 <= r && r <= 1.0 : 0.0 < r && r < 1.0;
-    }
-
-    /// Stores the only candidate, which stays there even if the interval does not hold it.
-    [[nodiscard]] int StoreSingle(double r, double* roots) const noexcept
-    {
-        roots[0] = r;
-        return Holds(r) ? 1 : 0;
-    }
-};
-
 } // namespace
 
 template <int N>
@@ -189,47 +168,12 @@ void SolvePolynomial_BezierDivide_NewtonsMethod(const vector2d* bez, const doubl
     count = Search<N>(c, roots, count).Run(bez);
 }
 
-template <>
-int FindRoots<2>(const double* c, double* roots, bool includeEndpoints) noexcept
-{
-    const UnitInterval interval{includeEndpoints};
-    if (std::fabs(c[0]) <= linearTolerance)
-        return c[1] == 0.0 ? 0 : interval.StoreSingle(-c[2] / c[1], roots);
-    if (c[2] == 0.0) {
-        const double r = -c[1] / c[0];
-        if (!includeEndpoints)
-            return interval.StoreSingle(r, roots);
-        roots[0] = 0.0;
-        if (!interval.Holds(r))
-            return 1;
-        roots[1] = r;
-        return 2;
-    }
-    const double p = c[1] / c[0] * 0.5;
-    const double q = c[2] / c[0];
-    const double discriminant = p * p - q;
-    if (discriminant == 0.0)
-        return interval.StoreSingle(-p, roots);
-    if (discriminant < 0.0)
-        return 0;
-    const double s = std::sqrt(discriminant);
-    int count = 0;
-    for (const double r : {s - p, -s - p})
-        if (interval.Holds(r))
-            roots[count++] = r;
-    SortAscending(roots, count);
-    return count;
-}
+namespace {
 
+/// Degree 3 and higher.
 template <int N>
-int FindRoots(const double* c, double* roots, bool includeEndpoints) noexcept
+int FindRootsBySubdivision(const double* c, double* roots, bool includeEndpoints) noexcept
 {
-    if (c[0] == 0.0)
-        return FindRoots<N - 1>(c + 1, roots, includeEndpoints);
-    if (c[N] == 0.0) {
-        const int count = FindRoots<N - 1>(c, roots, includeEndpoints);
-        return includeEndpoints && c[N - 1] != 0.0 ? AddRootAtZero<N>(roots, count) : count;
-    }
     vector2d bez[N + 1];
     PolynomialToBernsteinT<N, 0>::Convert(c, bez);
     int count = 0;
@@ -239,6 +183,24 @@ int FindRoots(const double* c, double* roots, bool includeEndpoints) noexcept
     if (includeEndpoints && IsNearZero(bez[N].y))
         roots[count++] = 1.0;
     return count;
+}
+
+} // namespace
+
+template <int N>
+int FindRoots(const double* c, double* roots, bool includeEndpoints) noexcept
+{
+    if constexpr (N == 2) {
+        return FindQuadraticRoots(c, roots, includeEndpoints);
+    } else {
+        if (c[0] == 0.0)
+            return FindRoots<N - 1>(c + 1, roots, includeEndpoints);
+        if (c[N] == 0.0) {
+            const int count = FindRoots<N - 1>(c, roots, includeEndpoints);
+            return includeEndpoints && c[N - 1] != 0.0 ? AddRootAtZero<N>(roots, count) : count;
+        }
+        return FindRootsBySubdivision<N>(c, roots, includeEndpoints);
+    }
 }
 
 template void SolvePolynomial_BezierDivide_NewtonsMethod<3>(const vector2d*, const double*, double*, int&) noexcept;
@@ -252,6 +214,7 @@ template void SolvePolynomial_BezierDivide_NewtonsMethod<10>(const vector2d*, co
 template void SolvePolynomial_BezierDivide_NewtonsMethod<11>(const vector2d*, const double*, double*, int&) noexcept;
 template void SolvePolynomial_BezierDivide_NewtonsMethod<12>(const vector2d*, const double*, double*, int&) noexcept;
 
+template int FindRoots<2>(const double*, double*, bool) noexcept;
 template int FindRoots<3>(const double*, double*, bool) noexcept;
 template int FindRoots<4>(const double*, double*, bool) noexcept;
 template int FindRoots<5>(const double*, double*, bool) noexcept;
