@@ -1,6 +1,6 @@
 #include "ZarnMath/Numeric.h"
 
-#include <gtest/gtest.h>
+#include "tests/Bits.h"
 
 #include <cmath>
 #include <numeric>
@@ -9,8 +9,6 @@
 namespace ZarnMath {
 namespace {
 
-constexpr double nan = std::numeric_limits<double>::quiet_NaN();
-constexpr double infinity = std::numeric_limits<double>::infinity();
 constexpr int smallest = std::numeric_limits<int>::min();
 constexpr int largest = std::numeric_limits<int>::max();
 constexpr double epsilon = 2.220446049250313e-16;
@@ -62,7 +60,7 @@ TEST(CubeRoot, GoesThroughThePowerOfAThirdRoundedDown)
 
 TEST(CubeRoot, IsAFlatZeroUpToItsThreshold)
 {
-    const double above = std::nextafter(1e-10, 1.0);
+    const double above = Above(1e-10);
     EXPECT_EQ(CubeRoot(1e-10), 0.0);
     EXPECT_EQ(CubeRoot(-1e-10), 0.0);
     EXPECT_FALSE(std::signbit(CubeRoot(-1e-10)));

@@ -1,6 +1,6 @@
 #include "ZarnMath/Quaternion.h"
 
-#include <gtest/gtest.h>
+#include "tests/Bits.h"
 
 #include <cmath>
 #include <cstring>
@@ -203,8 +203,8 @@ TEST(ForceZeros, ThresholdsAreInclusive)
     const std::uint64_t bits = 0x3D4F400000000000U;
     std::memcpy(&axis, &bits, sizeof axis);
     ASSERT_EQ(axis, 2.220446049250313e-13);
-    const double aboveAxis = std::nextafter(axis, 1.0);
-    const double aboveScalar = std::nextafter(epsilon, 1.0);
+    const double aboveAxis = Above(axis);
+    const double aboveScalar = Above(epsilon);
     EXPECT_EQ(ForcedToZero({axis, -axis, axis, epsilon}), (Quaternion{0.0, 0.0, 0.0, 0.0}));
     EXPECT_EQ(ForcedToZero({axis, -axis, axis, -epsilon}), (Quaternion{0.0, 0.0, 0.0, 0.0}));
     const Quaternion kept{aboveAxis, -aboveAxis, aboveAxis, aboveScalar};
@@ -220,7 +220,6 @@ TEST(ForceZeros, LeavesNoNegativeZero)
 
 TEST(ForceZeros, LeavesNan)
 {
-    const double nan = std::numeric_limits<double>::quiet_NaN();
     const Quaternion q = ForcedToZero({nan, nan, nan, nan});
     EXPECT_TRUE(std::isnan(q.x) && std::isnan(q.y) && std::isnan(q.z) && std::isnan(q.w));
 }
@@ -297,8 +296,8 @@ TEST(Interpolate, RefusesExactlyBelowItsThreshold)
     // The two doubles d next to 1 - 1e-08, on either side of it.
     double below = 1.0 - 1e-08;
     while (1.0 - below < 1e-08)
-        below = std::nextafter(below, 0.0);
-    const double above = std::nextafter(below, 1.0);
+        below = Below(below);
+    const double above = Above(below);
     Quaternion out{};
     EXPECT_TRUE(Quaternion::Interpolate(unit, AtCosine(below), 0.5, out));
     EXPECT_FALSE(Quaternion::Interpolate(unit, AtCosine(above), 0.5, out));
@@ -324,7 +323,7 @@ TEST(Interpolate, DoesNotNormalise)
 TEST(Interpolate, NanGoesThrough)
 {
     Quaternion out{};
-    EXPECT_TRUE(Quaternion::Interpolate({std::numeric_limits<double>::quiet_NaN(), 0.0, 0.0, 0.0}, unit, 0.5, out));
+    EXPECT_TRUE(Quaternion::Interpolate({nan, 0.0, 0.0, 0.0}, unit, 0.5, out));
     EXPECT_TRUE(std::isnan(out.w));
 }
 

@@ -1,6 +1,6 @@
 #include "ZarnMath/WMath3D.h"
 
-#include <gtest/gtest.h>
+#include "tests/Bits.h"
 
 #include <cmath>
 #include <random>
@@ -304,7 +304,6 @@ TEST(QuaternionToMatrix, LargeAndNanComponentsDoNotTrap)
     EXPECT_EQ(huge.m[0][0], 65536);
     EXPECT_EQ(huge.m[1][1], 65538); // twice 2147483647 is -2 modulo 2^32
     EXPECT_EQ(huge.m[1][2], -2);
-    const double nan = std::numeric_limits<double>::quiet_NaN();
     EXPECT_EQ(ToMatrix({nan, nan, nan, nan}), Identity());
 }
 

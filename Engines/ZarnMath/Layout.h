@@ -60,7 +60,8 @@ struct Layout
 ///
 /// Positive lengths point into the frame whichever way its edges are ordered; on an axis without extent every length is
 /// 0. Centred, a given size lies about the middle of the frame, without its margins. A stretch that its minimum widens,
-/// centred, is placed as if the left edge of the frame, or its top, stood at 0.
+/// centred, is placed as if the left edge of the frame, or its top, stood at 0. A minimum height of 0 that is given
+/// flattens the object in a normal frame: heights run downward there, and are all below it.
 ///
 /// @param frame  the frame, of any kind
 /// @param layout the description
