@@ -29,6 +29,21 @@ static_assert(offsetof(PlainC::MATRIX, m21) == offsetof(MATRIX, m21));
 static_assert(offsetof(PlainC::MATRIX, m22) == offsetof(MATRIX, m22));
 static_assert(offsetof(PlainC::MATRIX, dy) == offsetof(MATRIX, dy));
 
+static_assert(areLaidOutAlike<PlainC::POINT3D, POINT3D>);
+static_assert(sizeof(POINT3D) == 3 * sizeof(std::int32_t));
+static_assert(std::is_same_v<decltype(PlainC::POINT3D::x), decltype(POINT3D::x)>);
+static_assert(offsetof(PlainC::POINT3D, y) == offsetof(POINT3D, y));
+static_assert(offsetof(PlainC::POINT3D, z) == offsetof(POINT3D, z));
+
+static_assert(areLaidOutAlike<PlainC::MATRIX3D, MATRIX3D>);
+static_assert(std::is_same_v<decltype(PlainC::MATRIX3D::m), decltype(MATRIX3D::m)>);
+
+static_assert(areLaidOutAlike<PlainC::Quaternion, Quaternion>);
+static_assert(std::is_same_v<decltype(PlainC::Quaternion::x), decltype(Quaternion::x)>);
+static_assert(offsetof(PlainC::Quaternion, y) == offsetof(Quaternion, y));
+static_assert(offsetof(PlainC::Quaternion, z) == offsetof(Quaternion, z));
+static_assert(offsetof(PlainC::Quaternion, w) == offsetof(Quaternion, w));
+
 } // namespace
 
 } // namespace ZarnMath

@@ -2,8 +2,8 @@
  * The plain-C functions of the library, for a C compiler.
  *
  * In C this header declares the structures and the functions. In C++ the functions are declared with the library's own
- * types, in ZarnMath/WMath.h, and the structures here stand in a namespace of their own: they serve to check that both
- * languages lay them out alike.
+ * types, in ZarnMath/WMath.h and ZarnMath/WMath3D.h, and the structures here stand in a namespace of their own: they
+ * serve to check that both languages lay them out alike.
  */
 #ifndef ZARNMATH_PLAIN_C_H
 #define ZARNMATH_PLAIN_C_H
@@ -12,6 +12,7 @@
 
 #ifdef __cplusplus
 #include "ZarnMath/WMath.h"
+#include "ZarnMath/WMath3D.h"
 
 namespace ZarnMath::PlainC {
 #endif
@@ -38,6 +39,32 @@ typedef struct MATRIX
     double m22; /* y output per y input */
     double dy;  /* y translation */
 } MATRIX;
+
+/* A position in space, in whole units. */
+typedef struct POINT3D
+{
+    int32_t x;
+    int32_t y;
+    int32_t z;
+} POINT3D;
+
+/*
+ * An affine transform of space, applied to column vectors. Columns 0 to 2 are fixed point, with 65536 for 1; column 3 is
+ * the translation, in whole units.
+ */
+typedef struct MATRIX3D
+{
+    int32_t m[3][4]; /* m[row][column] */
+} MATRIX3D;
+
+/* x i + y j + z k + w. */
+typedef struct Quaternion
+{
+    double x;
+    double y;
+    double z;
+    double w; /* the scalar part */
+} Quaternion;
 
 #ifdef __cplusplus
 } // namespace ZarnMath::PlainC
@@ -69,6 +96,29 @@ void UTLSkewMatrix(MATRIX* matrix, int angleX, int angleY, int cx, int cy);
 /* Transforms points in place, each coordinate rounded to the nearest unit, halves away from 0. A count below 1 does
  * nothing. */
 void UTLTransformPoint(POINT* points, const MATRIX* matrix, int64_t count);
+
+/*
+ * In space. Conversions to integers truncate toward 0, saturate at 32 bits and give 0 for NaN; sums of integers wrap. No
+ * pointer may be null, but with a count below 1, which does nothing.
+ */
+
+/* Makes the matrix the identity. */
+void MTHGet3DIdentityMatrix(MATRIX3D* out);
+
+/* Adds a translation after what the matrix does. */
+void MTHTranslate3DMatrix(MATRIX3D* m, int x, int y, int z);
+
+/* Transforms points in place, in single precision; the translation is added in integers. */
+void MTHTransform3DPoints(POINT3D* points, const MATRIX3D* m, int count);
+
+/* Projects points from a viewpoint onto the plane z = 0, into another array. Always 1. */
+int MTHPerspective3DProjection(const POINT3D* points, POINT* out, int count, const POINT3D* viewpoint);
+
+/* The matrix of a unit quaternion. As MTHTransform3DPoints reads it, it turns by the inverse. */
+void VECT_QuaternionToMat(const Quaternion* q, MATRIX3D* out);
+
+/* The unit quaternion of a rotation, the inverse of VECT_QuaternionToMat. */
+void VECT_MatToQuaternion(const MATRIX3D* m, Quaternion* out);
 
 #endif
 

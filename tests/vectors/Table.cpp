@@ -45,14 +45,20 @@ Table MakeTable()
     AddDecompositionAdapters(table);
     AddExtentsAdapters(table);
     AddIntersectionAdapters(table);
+    AddIntervalVectorAdapters(table);
+    AddLayoutAdapters(table);
     AddLengthAdapters(table);
     AddLineAdapters(table);
     AddMatrixAdapters(table);
+    AddNumericAdapters(table);
     AddPlatformAdapters(table);
     AddRootFinderAdapters(table);
     AddSelfIntersectionAdapters(table);
     AddTransformedBoundsAdapters(table);
+    AddTridiagonalMatrixAdapters(table);
     AddValueTypesAdapters(table);
+    AddVectorFieldAdapters(table);
+    AddWMath3DAdapters(table);
     return table;
 }
 

@@ -77,14 +77,20 @@ void AddCuttingAdapters(Table& table);
 void AddDecompositionAdapters(Table& table);
 void AddExtentsAdapters(Table& table);
 void AddIntersectionAdapters(Table& table);
+void AddIntervalVectorAdapters(Table& table);
+void AddLayoutAdapters(Table& table);
 void AddLengthAdapters(Table& table);
 void AddLineAdapters(Table& table);
 void AddMatrixAdapters(Table& table);
+void AddNumericAdapters(Table& table);
 void AddPlatformAdapters(Table& table);
 void AddRootFinderAdapters(Table& table);
 void AddSelfIntersectionAdapters(Table& table);
 void AddTransformedBoundsAdapters(Table& table);
+void AddTridiagonalMatrixAdapters(Table& table);
 void AddValueTypesAdapters(Table& table);
+void AddVectorFieldAdapters(Table& table);
+void AddWMath3DAdapters(Table& table);
 /// @}
 
 /// Runs one case.
