@@ -122,7 +122,6 @@ Corpus::Corpus(std::uint64_t seed)
         const std::size_t partner = PartnerOf(i);
         const point2d onPartner = Evaluate(forms[partner], random.Uniform(0.0, 1.0));
         real.others.push_back(Moved(real.curves[partner], crossing - onPartner));
-        otherForms.push_back(ToPowerForm(real.others[i].data()));
         real.points.push_back(random.Point(extent));
         real.pointsOnCurves.push_back(crossing + AsVector(random.Point(0.035)));
         real.lines.push_back(SegmentThrough(random, crossing));

@@ -54,7 +54,6 @@ struct Corpus
     Drawing<point2d> real;
     Drawing<POINT> integer; ///< the same drawing, rounded
     std::vector<PowerForm> forms;
-    std::vector<PowerForm> otherForms;
     std::vector<double> parameters;      ///< in (0, 1)
     std::vector<double> laterParameters; ///< between the parameter and 1
     std::vector<double> distances;       ///< up to 100 units, of either sign
