@@ -1,4 +1,4 @@
-// The nearest point of a cubic, the side of a point, the parameter of a point on the curve, and tangents through a point.
+// The nearest point of a cubic, the side and the parameter of a point, and tangents through it.
 
 #include "ZarnMath/Bezier.h"
 #include "benchmarks/Measure.h"
