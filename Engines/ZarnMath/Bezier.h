@@ -9,8 +9,9 @@
 /// The segment is t in [0, 1]. No parameter is clamped: outside that range the polynomial goes on. Arrays belong to the
 /// caller, hold as many elements as stated, and are not checked. `POINT` overloads compute in double and round once, at
 /// the end, except where a function says otherwise. Nothing here fails but by its result; every degenerate curve has a
-/// stated answer. All functions of this header are in the arithmetic class, the same bits on every machine, unless one
-/// says otherwise.
+/// stated answer. Where a vector cannot grow its exception passes through, and vectors that are filled side by side may
+/// then differ in length. All functions of this header are in the arithmetic class, the same bits on every machine,
+/// unless one says otherwise.
 #pragma once
 
 #include "ZarnMath/Export.h"
