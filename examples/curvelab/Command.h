@@ -1,0 +1,77 @@
+/// @file
+/// The commands of curvelab: each asks the library one question about a drawing.
+///
+/// A command is one entry of the table, made in a file of its own. To add one, write that file, declare its entry below
+/// and list it in `Commands`.
+#pragma once
+
+#include "Drawing.h"
+#include "Picture.h"
+#include "Progress.h"
+#include "Report.h"
+
+#include <functional>
+#include <map>
+#include <string>
+#include <vector>
+
+namespace curvelab {
+
+/// An option of a command that takes one value.
+struct OptionSpec
+{
+    std::string name;        ///< with its dashes
+    std::string placeholder; ///< what the help shows for the value
+    std::string help;
+    std::string fallback; ///< the value when the option is not given; empty if it must be
+};
+
+/// The values of a command's own options, by the name with its dashes. Each option of the command is present.
+using Arguments = std::map<std::string, std::string>;
+
+/// What a command works on.
+struct Job
+{
+    const Drawing& drawing;
+    bool integer; ///< whether the `POINT` overloads are asked, on control points rounded to whole units
+    Progress& progress;
+};
+
+/// Answers: asks the library, and tells the report and the picture.
+using Question = std::function<void(const Job& job, Report& report, Picture& picture)>;
+
+/// An entry of the table.
+struct Command
+{
+    std::string name;
+    std::string summary; ///< one line
+    std::string details; ///< what the help says below the options
+    std::vector<OptionSpec> options;
+    /// Reads the option values, before the drawing is loaded, so that a wrong one is named at once.
+    Question (*prepare)(const Arguments& arguments);
+};
+
+[[nodiscard]] Command ClosestCommand();
+[[nodiscard]] Command FlattenCommand();
+[[nodiscard]] Command SplitCommand();
+
+/// The table, in the order in which the help lists it.
+[[nodiscard]] inline std::vector<Command> Commands()
+{
+    return {FlattenCommand(), SplitCommand(), ClosestCommand()};
+}
+
+/// Calls f(curve, index) with each curve of a job's drawing in turn, and keeps the progress.
+template <typename F>
+void ForEachCurve(const Job& job, const std::string& task, F f)
+{
+    job.progress.Begin(task, CountCurves(job.drawing));
+    std::size_t index = 0;
+    for (const Contour& contour : job.drawing.contours)
+        for (const Cubic& curve : contour.curves) {
+            f(curve, index++);
+            job.progress.Step();
+        }
+}
+
+} // namespace curvelab

@@ -1,0 +1,134 @@
+#!/usr/bin/env python3
+"""Runs curvelab on the drawings of this folder and on text in installed fonts, and makes a page of the pictures.
+
+    demo.py CURVELAB FOLDER [FONT...]
+
+CURVELAB is the program, FOLDER the place for the pictures, the numbers and index.html (it is made if need be). FONTs are
+font files to set text in; without any, the usual places of a Debian system are looked through, and the text is left out
+where none of them is there.
+"""
+
+import html
+import json
+import os
+import subprocess
+import sys
+
+DRAWINGS = os.path.join(os.path.dirname(os.path.abspath(__file__)), "drawings")
+
+# One font with cubic outlines and one with quadratic ones.
+USUAL_FONTS = [
+    "/usr/share/texmf/fonts/opentype/public/tex-gyre/texgyrepagella-italic.otf",
+    "/usr/share/fonts/truetype/dejavu/DejaVuSerif.ttf",
+]
+
+
+def drawing(name):
+    return [os.path.join(DRAWINGS, name)]
+
+
+def text(words, font):
+    return ["--text", words, "--font", font]
+
+
+def scenes(fonts):
+    """What is shown: a heading, what there is to see, and the command line behind the program's name."""
+    for name, to in (("nautilus.svg", "67000,52000"), ("rose-window.svg", "50000,19000")):
+        yield (f"flatten {name}", "Polylines within 150 units of the curves.",
+               ["flatten", *drawing(name), "--tolerance", "150"])
+        yield (f"split {name}", "Every curve, cut at t = 0.4.", ["split", *drawing(name), "--at", "0.4"])
+        yield (f"closest {name}", "The point of the drawing that is nearest to a given one.",
+               ["closest", *drawing(name), "--to", to])
+    yield ("flatten nautilus.svg, whole units", "A drawing 2000 units wide, in integers: vertices are rounded.",
+           ["flatten", *drawing("nautilus.svg"), "--tolerance", "2", "--units", "2000", "--integer"])
+    for font in fonts:
+        family = os.path.splitext(os.path.basename(font))[0]
+        yield (f"flatten a line of text, {family}", "Outlines of a font; quadratics are raised to cubics.",
+               ["flatten", *text("Ampersand &", font), "--tolerance", "100"])
+        yield (f"split a line of text, {family}", "Every curve of the letters, cut in the middle.",
+               ["split", *text("Ampersand &", font), "--at", "0.5"])
+        yield (f"closest in a line of text, {family}", "A point beside the letters and the nearest point on them.",
+               ["closest", *text("Ampersand &", font), "--to", "53000,16500"])
+
+
+def run(curvelab, folder, number, scene):
+    """Makes one picture; gives its figure for the page."""
+    heading, remark, arguments = scene
+    picture, numbers = f"{number:02}-{arguments[0]}.svg", f"{number:02}-{arguments[0]}.json"
+    subprocess.run([curvelab, *arguments, "-o", os.path.join(folder, picture),
+                    "--json", os.path.join(folder, numbers)], check=True)
+    with open(os.path.join(folder, numbers), encoding="utf-8") as file:
+        content = json.load(file)
+    return figure(heading, remark, arguments, picture, numbers, content)
+
+
+def readable(value):
+    if isinstance(value, float):
+        return f"{value:.6g}"
+    if isinstance(value, list):
+        return ", ".join(readable(each) for each in value) if len(value) <= 2 else f"{len(value)} values"
+    return str(value)
+
+
+def figure(heading, remark, arguments, picture, numbers, content):
+    shown = [a if a.startswith("-") or "/" not in a else os.path.basename(a) for a in arguments]
+    command = "curvelab " + " ".join(f'"{a}"' if " " in a else a for a in shown)
+    facts = {"curves of the drawing": content["drawing"]["curves"], **content["answer"]}
+    rows = "".join(f"<tr><th>{html.escape(key)}</th><td>{html.escape(readable(value))}</td></tr>"
+                   for key, value in facts.items())
+    return (f"<figure><h2>{html.escape(heading)}</h2><p>{html.escape(remark)}</p><code>{html.escape(command)}</code>"
+            f'<a href="{picture}"><img src="{picture}" alt="{html.escape(heading)}"></a>'
+            f'<details><summary>numbers</summary><table>{rows}</table><a href="{numbers}">all of them, as JSON</a>'
+            "</details></figure>")
+
+
+PAGE = """<!DOCTYPE html>
+<html lang="en">
+<head>
+<meta charset="utf-8">
+<meta name="viewport" content="width=device-width, initial-scale=1">
+<title>curvelab</title>
+<style>
+body {{ margin: 2rem; background: #eef0f3; color: #1d2530; font: 16px/1.5 Helvetica, Arial, sans-serif; }}
+main {{ display: grid; grid-template-columns: repeat(auto-fit, minmax(26rem, 1fr)); gap: 2rem; align-items: start; }}
+figure {{ margin: 0; padding: 1.25rem; background: #fff; border-radius: 8px; box-shadow: 0 1px 4px #0002; }}
+h2 {{ margin: 0; font-size: 1.1rem; }}
+p {{ margin: .2rem 0 .6rem; color: #5b6673; }}
+code {{ display: block; padding: .4rem .6rem; background: #f4f5f7; border-radius: 4px; overflow-x: auto; white-space: nowrap; }}
+img {{ display: block; width: 100%; margin: .8rem 0; }}
+summary {{ cursor: pointer; color: #5b6673; }}
+th {{ padding-right: 1.5rem; text-align: left; font-weight: 400; color: #5b6673; }}
+td {{ font-variant-numeric: tabular-nums; }}
+</style>
+</head>
+<body>
+<h1>What ZarnMath knows about some drawings</h1>
+<main>
+{figures}
+</main>
+</body>
+</html>
+"""
+
+
+def main():
+    if len(sys.argv) < 3:
+        sys.exit(__doc__)
+    curvelab, folder = sys.argv[1], sys.argv[2]
+    fonts = sys.argv[3:] or [font for font in USUAL_FONTS if os.path.exists(font)]
+    if not fonts:
+        print("demo: none of the usual fonts is installed, so there is no text", file=sys.stderr)
+    os.makedirs(folder, exist_ok=True)
+    try:
+        figures = [run(curvelab, folder, number, scene) for number, scene in enumerate(scenes(fonts), 1)]
+    except (OSError, subprocess.CalledProcessError) as error:
+        sys.exit(f"demo: {error}")
+    index = os.path.join(folder, "index.html")
+    with open(index, "w", encoding="utf-8") as file:
+        file.write(PAGE.format(figures="\n".join(figures)))
+    print(f"{len(figures)} pictures and their numbers are in {os.path.abspath(folder)}")
+    print(f"Look at them side by side: file://{os.path.abspath(index)}")
+
+
+if __name__ == "__main__":
+    main()

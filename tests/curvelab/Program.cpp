@@ -1,0 +1,152 @@
+#include "Program.h"
+
+#include <algorithm>
+#include <cstdlib>
+#include <fcntl.h>
+#include <fstream>
+#include <gtest/gtest.h>
+#include <nlohmann/json.hpp>
+#include <sstream>
+#include <sys/wait.h>
+#include <unistd.h>
+
+namespace fs = std::filesystem;
+
+namespace {
+
+/// In the child: standard input from nowhere, the outputs to files.
+void Redirect(const fs::path& out, const fs::path& err)
+{
+    constexpr int flags = O_WRONLY | O_CREAT | O_TRUNC;
+    ::dup2(::open("/dev/null", O_RDONLY), STDIN_FILENO);
+    ::dup2(::open(out.c_str(), flags, 0600), STDOUT_FILENO);
+    ::dup2(::open(err.c_str(), flags, 0600), STDERR_FILENO);
+}
+
+std::vector<char*> Pointers(std::vector<std::string>& words)
+{
+    std::vector<char*> pointers;
+    for (std::string& word : words)
+        pointers.push_back(word.data());
+    pointers.push_back(nullptr);
+    return pointers;
+}
+
+} // namespace
+
+Outcome RunCurvelab(const std::vector<std::string>& arguments, const fs::path& folder)
+{
+    const TemporaryFolder outputs;
+    const fs::path out = outputs.Path() / "out";
+    const fs::path err = outputs.Path() / "err";
+    std::vector<std::string> words{CURVELAB_PROGRAM};
+    words.insert(words.end(), arguments.begin(), arguments.end());
+    const std::vector<char*> pointers = Pointers(words);
+
+    const pid_t child = ::fork();
+    if (child == 0) {
+        Redirect(out, err);
+        if (::chdir(folder.c_str()) == 0)
+            ::execv(pointers[0], pointers.data());
+        ::_exit(127);
+    }
+    int status = 0;
+    ::waitpid(child, &status, 0);
+    return {WIFEXITED(status) ? WEXITSTATUS(status) : -1, ContentOf(out), ContentOf(err)};
+}
+
+struct Numbers::Tree
+{
+    nlohmann::json root;
+};
+
+Numbers::Numbers(const std::string& json)
+    : tree_(std::make_unique<Tree>(Tree{nlohmann::json::parse(json, nullptr, false)}))
+{
+    EXPECT_FALSE(tree_->root.is_discarded()) << json;
+}
+
+Numbers::~Numbers() = default;
+Numbers::Numbers(Numbers&&) noexcept = default;
+
+template <typename T>
+T Numbers::Value(const std::string& pointer) const
+{
+    try {
+        return tree_->root.at(nlohmann::json::json_pointer(pointer)).get<T>();
+    } catch (const nlohmann::json::exception& error) {
+        ADD_FAILURE() << pointer << ": " << error.what();
+        return T();
+    }
+}
+
+bool Numbers::Has(const std::string& pointer) const
+{
+    return tree_->root.contains(nlohmann::json::json_pointer(pointer));
+}
+
+double Numbers::Number(const std::string& pointer) const
+{
+    return Value<double>(pointer);
+}
+
+bool Numbers::Truth(const std::string& pointer) const
+{
+    return Value<bool>(pointer);
+}
+
+std::string Numbers::Text(const std::string& pointer) const
+{
+    return Value<std::string>(pointer);
+}
+
+std::size_t Numbers::Size(const std::string& pointer) const
+{
+    return Value<nlohmann::json::array_t>(pointer).size();
+}
+
+TemporaryFolder::TemporaryFolder()
+{
+    std::string pattern = (fs::temp_directory_path() / "curvelab-test-XXXXXX").string();
+    if (!::mkdtemp(pattern.data()))
+        std::abort();
+    path_ = pattern;
+}
+
+TemporaryFolder::~TemporaryFolder()
+{
+    std::error_code ignored;
+    fs::remove_all(path_, ignored);
+}
+
+std::string TemporaryFolder::Write(const std::string& name, const std::string& content) const
+{
+    const fs::path path = path_ / name;
+    std::ofstream(path, std::ios::binary) << content;
+    return path.string();
+}
+
+std::string TemporaryFolder::WriteSvg(const std::string& content, const std::string& name) const
+{
+    return Write(name, R"(<svg xmlns="http://www.w3.org/2000/svg" xmlns:xlink="http://www.w3.org/1999/xlink" )"
+                       R"(width="1000" height="1000">)" +
+                           content + "</svg>");
+}
+
+std::vector<std::string> TemporaryFolder::Names() const
+{
+    std::vector<std::string> names;
+    for (const fs::directory_entry& entry : fs::directory_iterator(path_))
+        names.push_back(entry.path().filename().string());
+    std::sort(names.begin(), names.end());
+    return names;
+}
+
+std::string ContentOf(const fs::path& path)
+{
+    std::ifstream file(path, std::ios::binary);
+    EXPECT_TRUE(file.good()) << path;
+    std::ostringstream content;
+    content << file.rdbuf();
+    return content.str();
+}
