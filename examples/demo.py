@@ -39,6 +39,10 @@ def scenes(fonts):
         yield (f"split {name}", "Every curve, cut at t = 0.4.", ["split", *drawing(name), "--at", "0.4"])
         yield (f"closest {name}", "The point of the drawing that is nearest to a given one.",
                ["closest", *drawing(name), "--to", to])
+    yield ("transform nautilus.svg", "Turned, stretched and skewed: what circles become, and the point that stays.",
+           ["transform", *drawing("nautilus.svg"), "--by", "rotate:30 scale:1.4,0.8 skew:10,0"])
+    yield ("transform rose-window.svg", "A mirror, and the line that it leaves in place.",
+           ["transform", *drawing("rose-window.svg"), "--by", "mirror:70@70000,50000"])
     yield ("flatten nautilus.svg, whole units", "A drawing 2000 units wide, in integers: vertices are rounded.",
            ["flatten", *drawing("nautilus.svg"), "--tolerance", "2", "--units", "2000", "--integer"])
     for font in fonts:

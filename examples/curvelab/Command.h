@@ -54,11 +54,12 @@ struct Command
 [[nodiscard]] Command ClosestCommand();
 [[nodiscard]] Command FlattenCommand();
 [[nodiscard]] Command SplitCommand();
+[[nodiscard]] Command TransformCommand();
 
 /// The table, in the order in which the help lists it.
 [[nodiscard]] inline std::vector<Command> Commands()
 {
-    return {FlattenCommand(), SplitCommand(), ClosestCommand()};
+    return {FlattenCommand(), SplitCommand(), ClosestCommand(), TransformCommand()};
 }
 
 /// Calls f(curve, index) with each curve of a job's drawing in turn, and keeps the progress.
