@@ -314,7 +314,8 @@ extern template ZARNMATH_API double Length<point2d>(const point2d*, LengthAccura
 ///
 /// @param a, b, c, d           power form
 /// @param q                    query point
-/// @param[out] t               parameter of the nearest point, in [0, 1]
+/// @param[out] t               parameter of the nearest point, in [0, 1] but for a double root, whose search is not
+///                             confined
 /// @param[out] point           the nearest point, by Horner's rule
 /// @param[out] distanceSquared its squared distance from q
 /// @return whether there is a stationary point. If not, the three results are untouched. Among equal distances the
@@ -332,7 +333,8 @@ ZARNMATH_API bool FindClosestPointOnBezier(const point2d* bezier, const point2d&
 ///
 /// @param bezier               four control points
 /// @param q                    query point
-/// @param[out] t               parameter of the nearest point, in [0, 1]
+/// @param[out] t               parameter of the nearest point, in [0, 1] but for a double root, whose search is not
+///                             confined
 /// @param[out] point           the nearest point, rounded
 /// @param[out] distanceSquared the squared distance of the *unrounded* point from q
 /// @return whether there is a stationary point; if not, the three results are untouched
