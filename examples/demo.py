@@ -1,5 +1,6 @@
 #!/usr/bin/env python3
-"""Runs curvelab on the drawings of this folder and on text in installed fonts, and makes a page of the pictures.
+"""Runs curvelab on the drawings of this folder and on text in installed fonts, then the small examples that were built
+beside it, and makes a page of the pictures.
 
     demo.py CURVELAB FOLDER [FONT...]
 
@@ -20,6 +21,13 @@ DRAWINGS = os.path.join(os.path.dirname(os.path.abspath(__file__)), "drawings")
 USUAL_FONTS = [
     "/usr/share/texmf/fonts/opentype/public/tex-gyre/texgyrepagella-italic.otf",
     "/usr/share/fonts/truetype/dejavu/DejaVuSerif.ttf",
+]
+
+SMALL_EXAMPLES = [
+    ("warp", "A sparse field of displacements bends a grid of lines."),
+    ("spline", "A closed curve through points by the cyclic solver, and beside it how much it bends."),
+    ("layout", "A page laid out by descriptions, with one ornament carried into each part."),
+    ("cube", "A cube turned along the arc between two quaternions, in perspective."),
 ]
 
 
@@ -86,6 +94,16 @@ def figure(heading, remark, arguments, picture, numbers, content):
             "</details></figure>")
 
 
+def run_small(examples, folder, number, name, remark):
+    """Makes the picture of a small example; gives its figure for the page."""
+    picture = f"{number:02}-{name}.svg"
+    numbers = subprocess.run([os.path.join(examples, name, name), os.path.join(folder, picture)], check=True,
+                             capture_output=True, text=True).stdout
+    return (f"<figure><h2>{name}</h2><p>{html.escape(remark)}</p><code>{name} {picture}</code>"
+            f'<a href="{picture}"><img src="{picture}" alt="{name}"></a>'
+            f"<details><summary>numbers</summary><pre>{html.escape(numbers)}</pre></details></figure>")
+
+
 PAGE = """<!DOCTYPE html>
 <html lang="en">
 <head>
@@ -100,6 +118,7 @@ h2 {{ margin: 0; font-size: 1.1rem; }}
 p {{ margin: .2rem 0 .6rem; color: #5b6673; }}
 code {{ display: block; padding: .4rem .6rem; background: #f4f5f7; border-radius: 4px; overflow-x: auto; white-space: nowrap; }}
 img {{ display: block; width: 100%; margin: .8rem 0; }}
+pre {{ margin: .6rem 0 0; overflow-x: auto; font-size: .8rem; }}
 summary {{ cursor: pointer; color: #5b6673; }}
 th {{ padding-right: 1.5rem; text-align: left; font-weight: 400; color: #5b6673; }}
 td {{ font-variant-numeric: tabular-nums; }}
@@ -125,6 +144,9 @@ def main():
     os.makedirs(folder, exist_ok=True)
     try:
         figures = [run(curvelab, folder, number, scene) for number, scene in enumerate(scenes(fonts), 1)]
+        examples = os.path.dirname(os.path.dirname(os.path.abspath(curvelab)))
+        built = [small for small in SMALL_EXAMPLES if os.path.exists(os.path.join(examples, small[0], small[0]))]
+        figures += [run_small(examples, folder, number, *small) for number, small in enumerate(built, len(figures) + 1)]
     except (OSError, subprocess.CalledProcessError) as error:
         sys.exit(f"demo: {error}")
     index = os.path.join(folder, "index.html")

@@ -1,4 +1,4 @@
-/* The plain-C family from C, through the shared library. */
+/* The plain-C families from C, through the shared library. */
 #include "ZarnMath/PlainC.h"
 
 #include <stdio.h>
@@ -54,10 +54,42 @@ static void TestPoints(void)
     Expect(points[0].x == 3, "a negative count");
 }
 
+static void TestSpace(void)
+{
+    MATRIX3D m;
+    POINT3D points[3] = {{1, 2, 3}, {-4, 5, -6}, {7, 7, 7}};
+    const POINT3D viewpoint = {0, 0, 100};
+    const POINT3D halfway = {10, -4, 50};
+    POINT images[2] = {{7, 7}, {7, 7}};
+    MTHGet3DIdentityMatrix(&m);
+    MTHTranslate3DMatrix(&m, 10, 20, 30);
+    Expect(m.m[0][0] == 65536 && m.m[0][1] == 0 && m.m[1][3] == 20 && m.m[2][2] == 65536, "rows of a matrix in space");
+    MTHTransform3DPoints(points, &m, 2);
+    Expect(points[0].x == 11 && points[0].y == 22 && points[0].z == 33, "the first point in space");
+    Expect(points[1].x == 6 && points[1].y == 25 && points[1].z == 24, "the second point in space");
+    Expect(points[2].x == 7, "the point in space behind the last one");
+    Expect(MTHPerspective3DProjection(&halfway, images, 1, &viewpoint) == 1, "the result of the projection");
+    Expect(images[0].x == 20 && images[0].y == -8 && images[1].x == 7, "a projection");
+}
+
+static void TestQuaternions(void)
+{
+    const Quaternion halfTurn = {1.0, 0.0, 0.0, 0.0};
+    Quaternion back = {7.0, 7.0, 7.0, 7.0};
+    MATRIX3D m;
+    VECT_QuaternionToMat(&halfTurn, &m);
+    Expect(m.m[0][0] == 65536 && m.m[1][1] == -65536 && m.m[2][2] == -65536 && m.m[0][3] == 0, "half a turn about x");
+    VECT_MatToQuaternion(&m, &back);
+    Expect(back.x == 1.0 && back.y == 0.0 && back.z == 0.0 && back.w == 0.0, "its quaternion");
+}
+
 int main(void)
 {
     Expect(sizeof(MATRIX) == 48 && sizeof(POINT) == 8, "the sizes");
+    Expect(sizeof(MATRIX3D) == 48 && sizeof(POINT3D) == 12 && sizeof(Quaternion) == 32, "the sizes in space");
     TestSteps();
     TestPoints();
+    TestSpace();
+    TestQuaternions();
     return failures == 0 ? 0 : 1;
 }
