@@ -3,10 +3,10 @@
 // ratios. "roots" is the mean number of roots that each of them finds.
 
 #include "ZarnMath/RootFinder.h"
+#include "benchmarks/Measure.h"
 #include "tests/LiteralRootFinder.h"
 
 #include <array>
-#include <benchmark/benchmark.h>
 #include <random>
 #include <vector>
 
@@ -14,10 +14,8 @@
 #include <2geom/bezier.h>
 #endif
 
-namespace ZarnMath {
+namespace ZarnMath::Benchmarks {
 namespace {
-
-constexpr int corpusSize = 2000;
 
 template <int N>
 using Ordinates = std::array<double, N + 1>;
@@ -53,15 +51,13 @@ void RunOnCoefficients(benchmark::State& state)
     std::vector<std::array<double, N + 1>> polynomials;
     for (const auto& polygon : RandomPolygons<N>())
         polynomials.push_back(ToCoefficients<N>(polygon));
-    std::int64_t found = 0;
-    std::size_t next = 0;
-    for (auto _ : state) {
+    const auto find = [](const std::array<double, N + 1>& c) {
         double roots[N + 1];
-        found += Find(polynomials[next].data(), roots, false);
+        const int count = Find(c.data(), roots, false);
         benchmark::DoNotOptimize(roots);
-        next = next + 1 < polynomials.size() ? next + 1 : 0;
-    }
-    state.counters["roots"] = benchmark::Counter(static_cast<double>(found), benchmark::Counter::kAvgIterations);
+        return count;
+    };
+    MeasureWork(state, "roots", find, polynomials);
 }
 
 template <int N>
@@ -104,15 +100,8 @@ void Lib2geomBezierRoots(benchmark::State& state)
     std::vector<Geom::Bezier> polynomials;
     for (const auto& polygon : RandomPolygons<N>())
         polynomials.emplace_back(std::vector<double>(polygon.begin(), polygon.end()));
-    std::int64_t found = 0;
-    std::size_t next = 0;
-    for (auto _ : state) {
-        const std::vector<double> roots = polynomials[next].roots();
-        found += static_cast<std::int64_t>(roots.size());
-        benchmark::DoNotOptimize(roots.data());
-        next = next + 1 < polynomials.size() ? next + 1 : 0;
-    }
-    state.counters["roots"] = benchmark::Counter(static_cast<double>(found), benchmark::Counter::kAvgIterations);
+    const auto find = [](const Geom::Bezier& polynomial) { return std::ssize(polynomial.roots()); };
+    MeasureWork(state, "roots", find, polynomials);
 }
 
 BENCHMARK_TEMPLATE(Lib2geomBezierRoots, 3);
@@ -123,4 +112,4 @@ BENCHMARK_TEMPLATE(Lib2geomBezierRoots, 12);
 #endif
 
 } // namespace
-} // namespace ZarnMath
+} // namespace ZarnMath::Benchmarks

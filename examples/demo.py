@@ -1,5 +1,6 @@
 #!/usr/bin/env python3
-"""Runs curvelab on the drawings of this folder and on text in installed fonts, and makes a page of the pictures.
+"""Runs curvelab on the drawings of this folder and on text in installed fonts, then the small examples that were built
+beside it, and makes a page of the pictures.
 
     demo.py CURVELAB FOLDER [FONT...]
 
@@ -22,6 +23,13 @@ USUAL_FONTS = [
     "/usr/share/fonts/truetype/dejavu/DejaVuSerif.ttf",
 ]
 
+SMALL_EXAMPLES = [
+    ("warp", "A sparse field of displacements bends a grid of lines."),
+    ("spline", "A closed curve through points by the cyclic solver, and beside it how much it bends."),
+    ("layout", "A page laid out by descriptions, with one ornament carried into each part."),
+    ("cube", "A cube turned along the arc between two quaternions, in perspective."),
+]
+
 
 def drawing(name):
     return [os.path.join(DRAWINGS, name)]
@@ -39,6 +47,10 @@ def scenes(fonts):
         yield (f"split {name}", "Every curve, cut at t = 0.4.", ["split", *drawing(name), "--at", "0.4"])
         yield (f"closest {name}", "The point of the drawing that is nearest to a given one.",
                ["closest", *drawing(name), "--to", to])
+    yield ("transform nautilus.svg", "Turned, stretched and skewed: what circles become, and the point that stays.",
+           ["transform", *drawing("nautilus.svg"), "--by", "rotate:30 scale:1.4,0.8 skew:10,0"])
+    yield ("transform rose-window.svg", "A mirror, and the line that it leaves in place.",
+           ["transform", *drawing("rose-window.svg"), "--by", "mirror:70@70000,50000"])
     yield ("flatten nautilus.svg, whole units", "A drawing 2000 units wide, in integers: vertices are rounded.",
            ["flatten", *drawing("nautilus.svg"), "--tolerance", "2", "--units", "2000", "--integer"])
     for name in ("nautilus.svg", "knots.svg"):
@@ -108,6 +120,16 @@ def figure(heading, remark, arguments, picture, numbers, content):
             "</details></figure>")
 
 
+def run_small(examples, folder, number, name, remark):
+    """Makes the picture of a small example; gives its figure for the page."""
+    picture = f"{number:02}-{name}.svg"
+    numbers = subprocess.run([os.path.join(examples, name, name), os.path.join(folder, picture)], check=True,
+                             capture_output=True, text=True).stdout
+    return (f"<figure><h2>{name}</h2><p>{html.escape(remark)}</p><code>{name} {picture}</code>"
+            f'<a href="{picture}"><img src="{picture}" alt="{name}"></a>'
+            f"<details><summary>numbers</summary><pre>{html.escape(numbers)}</pre></details></figure>")
+
+
 PAGE = """<!DOCTYPE html>
 <html lang="en">
 <head>
@@ -122,6 +144,7 @@ h2 {{ margin: 0; font-size: 1.1rem; }}
 p {{ margin: .2rem 0 .6rem; color: #5b6673; }}
 code {{ display: block; padding: .4rem .6rem; background: #f4f5f7; border-radius: 4px; overflow-x: auto; white-space: nowrap; }}
 img {{ display: block; width: 100%; margin: .8rem 0; }}
+pre {{ margin: .6rem 0 0; overflow-x: auto; font-size: .8rem; }}
 summary {{ cursor: pointer; color: #5b6673; }}
 th {{ padding-right: 1.5rem; text-align: left; font-weight: 400; color: #5b6673; }}
 td {{ font-variant-numeric: tabular-nums; }}
@@ -147,6 +170,9 @@ def main():
     os.makedirs(folder, exist_ok=True)
     try:
         figures = [run(curvelab, folder, number, scene) for number, scene in enumerate(scenes(fonts), 1)]
+        examples = os.path.dirname(os.path.dirname(os.path.abspath(curvelab)))
+        built = [small for small in SMALL_EXAMPLES if os.path.exists(os.path.join(examples, small[0], small[0]))]
+        figures += [run_small(examples, folder, number, *small) for number, small in enumerate(built, len(figures) + 1)]
     except (OSError, subprocess.CalledProcessError) as error:
         sys.exit(f"demo: {error}")
     index = os.path.join(folder, "index.html")

@@ -9,8 +9,9 @@
 /// The segment is t in [0, 1]. No parameter is clamped: outside that range the polynomial goes on. Arrays belong to the
 /// caller, hold as many elements as stated, and are not checked. `POINT` overloads compute in double and round once, at
 /// the end, except where a function says otherwise. Nothing here fails but by its result; every degenerate curve has a
-/// stated answer. All functions of this header are in the arithmetic class, the same bits on every machine, unless one
-/// says otherwise.
+/// stated answer. Where a vector cannot grow its exception passes through, and vectors that are filled side by side may
+/// then differ in length. All functions of this header are in the arithmetic class, the same bits on every machine,
+/// unless one says otherwise.
 #pragma once
 
 #include "ZarnMath/Export.h"
@@ -314,7 +315,8 @@ extern template ZARNMATH_API double Length<point2d>(const point2d*, LengthAccura
 ///
 /// @param a, b, c, d           power form
 /// @param q                    query point
-/// @param[out] t               parameter of the nearest point, in [0, 1]
+/// @param[out] t               parameter of the nearest point, in [0, 1] but for a double root, whose search is not
+///                             confined
 /// @param[out] point           the nearest point, by Horner's rule
 /// @param[out] distanceSquared its squared distance from q
 /// @return whether there is a stationary point. If not, the three results are untouched. Among equal distances the
@@ -332,7 +334,8 @@ ZARNMATH_API bool FindClosestPointOnBezier(const point2d* bezier, const point2d&
 ///
 /// @param bezier               four control points
 /// @param q                    query point
-/// @param[out] t               parameter of the nearest point, in [0, 1]
+/// @param[out] t               parameter of the nearest point, in [0, 1] but for a double root, whose search is not
+///                             confined
 /// @param[out] point           the nearest point, rounded
 /// @param[out] distanceSquared the squared distance of the *unrounded* point from q
 /// @return whether there is a stationary point; if not, the three results are untouched

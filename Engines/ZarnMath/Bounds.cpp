@@ -1,6 +1,7 @@
 #include "ZarnMath/Bounds.h"
 
 #include "ZarnMath/ValueTypesInternal.h"
+#include "ZarnMath/WMathInternal.h"
 
 #include <algorithm>
 #include <utility>
@@ -61,6 +62,40 @@ bool Contains(const RECT& rect, const P& p) noexcept
     if (!(rect.left <= p.x && p.x <= rect.right))
         return false;
     return (rect.bottom <= p.y && p.y <= rect.top) || (rect.top <= p.y && p.y <= rect.bottom);
+}
+
+template <typename P, typename Box>
+Box BoxOfTransformedCorners(const Box& box, const MATRIX& m) noexcept
+{
+    P corners[4];
+    StoreCorners(box, corners);
+    m.TransformPoints(corners, 4);
+    return GetPointsBBox(corners, 4);
+}
+
+/// All zeros if there is none, which takes every corner to the origin.
+MATRIX InverseOf(const MATRIX& m) noexcept
+{
+    MATRIX inverse = m;
+    inverse.Invert(DBL_EPSILON);
+    return inverse;
+}
+
+/// Where on the circle the coordinate x*cos(t) + y*sin(t) is extreme, from the tangent of half the angle.
+double ExtremeAngle(const vector2d& row) noexcept
+{
+    if (IsNearZero(row.y))
+        return 0.0;
+    if (IsNearZero(row.x))
+        return halfPi;
+    return 2.0 * std::atan((std::sqrt(LengthSquared(row)) - row.x) / row.y);
+}
+
+/// The box of the first of several points: fmin and fmax pass over a NaN, so that the others can still set the field.
+BoundsT<double> SeedWith(const point2d& p) noexcept
+{
+    constexpr double largest = std::numeric_limits<double>::max();
+    return {std::fmin(largest, p.x), std::fmax(-largest, p.y), std::fmax(-largest, p.x), std::fmin(largest, p.y)};
 }
 
 } // namespace
@@ -215,6 +250,57 @@ const BoundsT<double>& IdentityBounds() noexcept
 {
     static const BoundsT<double> identity{0.0, 1.0, 1.0, 0.0};
     return identity;
+}
+
+RECT GetTransformedBBox(const RECT& box, const MATRIX& m) noexcept
+{
+    return BoxOfTransformedCorners<POINT>(box, m);
+}
+
+BoundsT<double> GetTransformedBBox(const BoundsT<double>& box, const MATRIX& m) noexcept
+{
+    return BoxOfTransformedCorners<point2d>(box, m);
+}
+
+RECT GetUntransformedBBox(const RECT& box, const MATRIX& m) noexcept
+{
+    return GetTransformedBBox(box, InverseOf(m));
+}
+
+BoundsT<double> GetUntransformedBBox(const BoundsT<double>& box, const MATRIX& m) noexcept
+{
+    return GetTransformedBBox(box, InverseOf(m));
+}
+
+RECT GetTransformedPointsBBox(const POINT* points, unsigned long count, const MATRIX& m) noexcept
+{
+    RECT box = emptyRect;
+    for (unsigned long i = 0; i < count; ++i)
+        UnionPointWithRect(box, Image(m, ToPoint2d(points[i])));
+    return box;
+}
+
+BoundsT<double> GetTransformedPointsBBox(const point2d* points, unsigned long count, const MATRIX& m) noexcept
+{
+    BoundsT<double> box = emptyBounds;
+    for (unsigned long i = 0; i < count; ++i)
+        Widen(box, Image(m, points[i]));
+    return box;
+}
+
+point2d GetRemappedPoint(const point2d& p, const BoundsT<double>& from, const BoundsT<double>& to) noexcept
+{
+    return Image(ConstructRectTransformMatrix(from, to, MapStretch), p);
+}
+
+BoundsT<double> GetTransformedCircleBBox(const MATRIX& m, double radius, point2d centre) noexcept
+{
+    const vector2d a = Image(m, Radians::AngleToVector(ExtremeAngle(XRow(m)), radius));
+    const vector2d b = Image(m, Radians::AngleToVector(ExtremeAngle(YRow(m)), radius));
+    BoundsT<double> box = SeedWith(centre + a);
+    for (const point2d& p : {centre - a, centre + b, centre - b})
+        Widen(box, p);
+    return box;
 }
 
 } // namespace ZarnMath

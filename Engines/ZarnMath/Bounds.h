@@ -12,11 +12,12 @@
 /// | vertically ordered | bottom <= top                     | the entry of `IntersectRect`                          |
 ///
 /// Integer arithmetic wraps in 32 bits. A null pointer or a count below 1 is accepted only where stated. All functions
-/// are in the arithmetic class, the same bits on every machine.
+/// but `GetTransformedCircleBBox` are in the arithmetic class, the same bits on every machine.
 #pragma once
 
 #include "ZarnMath/Export.h"
 #include "ZarnMath/ValueTypes.h"
+#include "ZarnMath/WMath.h"
 
 namespace ZarnMath {
 
@@ -183,6 +184,67 @@ ZARNMATH_API void GetRectCorners(const RECT& box, POINT* out) noexcept;
 
 /// The unit square: left 0, top 1, right 1, bottom 0. The reference stays valid, and may be asked for from any thread.
 [[nodiscard]] ZARNMATH_API const BoundsT<double>& IdentityBounds() noexcept;
+
+/// @}
+/// @name Boxes through a transform
+/// Three ways of measuring, which do not replace each other: a `RECT` is the box of its corners, each rounded to the
+/// nearest unit; integer points are enclosed, by rounding outward; and double points are measured as they are, from the
+/// empty bounds on, so that the limits of the 32-bit integers show where all of them lie beyond.
+/// @{
+
+/// The box of the images of the four corners.
+///
+/// @param box the box; an empty one is transformed like any other, and is not marked as empty afterwards
+/// @param m   the transform
+/// @return the box. As a `RECT` it may fall short of the exact one by half a unit
+[[nodiscard]] ZARNMATH_API RECT GetTransformedBBox(const RECT& box, const MATRIX& m) noexcept;
+[[nodiscard]] ZARNMATH_API BoundsT<double> GetTransformedBBox(const BoundsT<double>& box, const MATRIX& m) noexcept;
+
+/// The box of what the transform takes to the four corners: `GetTransformedBBox` by the inverse.
+///
+/// @param box the box
+/// @param m   the transform, which stays as it is
+/// @return the box; all zeros where the determinant is at most DBL_EPSILON in magnitude, or NaN
+[[nodiscard]] ZARNMATH_API RECT GetUntransformedBBox(const RECT& box, const MATRIX& m) noexcept;
+[[nodiscard]] ZARNMATH_API BoundsT<double> GetUntransformedBBox(const BoundsT<double>& box, const MATRIX& m) noexcept;
+
+/// The smallest rectangle that encloses the exact images of points.
+///
+/// @param points the points; null is accepted only with a count of 0
+/// @param count  their number; 0 gives the empty rectangle
+/// @param m      the transform
+/// @return the rectangle, each side rounded outward
+[[nodiscard]] ZARNMATH_API RECT GetTransformedPointsBBox(const POINT* points, unsigned long count,
+                                                         const MATRIX& m) noexcept;
+
+/// The smallest bounds that hold the images of points and the empty bounds: `left` and `bottom` never exceed
+/// 2147483647.0, `right` and `top` never fall below -2147483648.0. Unlike `GetPointsBBox`, no point comes first.
+///
+/// @param points the points; null is accepted only with a count of 0
+/// @param count  their number; 0 gives the empty bounds
+/// @param m      the transform
+/// @return the bounds; an image with NaN widens nothing
+[[nodiscard]] ZARNMATH_API BoundsT<double> GetTransformedPointsBBox(const point2d* points, unsigned long count,
+                                                                    const MATRIX& m) noexcept;
+
+/// Where a point of one box lies in another one, with each axis stretched by itself.
+///
+/// @param p    the point
+/// @param from its box; a side of 0 gives infinities or NaN
+/// @param to   the other box
+/// @return the image of p under `ConstructRectTransformMatrix(from, to, MapStretch)`
+[[nodiscard]] ZARNMATH_API point2d GetRemappedPoint(const point2d& p, const BoundsT<double>& from,
+                                                    const BoundsT<double>& to) noexcept;
+
+/// The box of the ellipse that a transform makes of a circle (platform class: the last bits are those of the machine's
+/// atan, sin and cos).
+///
+/// @param m      the transform; its translation is not used, and a singular one gives the right flat box
+/// @param radius the radius of the circle
+/// @param centre the centre of the *ellipse*: it is not transformed
+/// @return the box, right beyond the limits of the 32-bit integers too
+[[nodiscard]] ZARNMATH_API BoundsT<double> GetTransformedCircleBBox(const MATRIX& m, double radius,
+                                                                    point2d centre) noexcept;
 
 /// @}
 

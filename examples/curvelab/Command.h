@@ -61,12 +61,14 @@ struct Command
 [[nodiscard]] Command LengthCommand();
 [[nodiscard]] Command SplitCommand();
 [[nodiscard]] Command TangentsCommand();
+[[nodiscard]] Command TransformCommand();
 
 /// The table, in the order in which the help lists it.
 [[nodiscard]] inline std::vector<Command> Commands()
 {
-    return {FlattenCommand(), SplitCommand(),     ClosestCommand(),  CurvatureCommand(), LengthCommand(),
-            BoundsCommand(),  IntersectCommand(), TangentsCommand(), AreaCommand(),      CuspsCommand()};
+    return {FlattenCommand(), SplitCommand(),  ClosestCommand(),   CurvatureCommand(),
+            LengthCommand(),  BoundsCommand(), IntersectCommand(), TangentsCommand(),
+            AreaCommand(),    CuspsCommand(),  TransformCommand()};
 }
 
 /// Calls f(curve, index) with each curve of a job's drawing in turn, and keeps the progress.

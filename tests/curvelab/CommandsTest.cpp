@@ -17,8 +17,8 @@ constexpr double centre = 50000.0;
 
 TEST(Program, DescribesTheDrawing)
 {
-    const Numbers json =
-        Ask("<rect x='5' y='5' width='30' height='15'/><circle cx='20' cy='10' r='2'/>", {"split", "--units=600"});
+    const Numbers json = AskCurvelab("<rect x='5' y='5' width='30' height='15'/><circle cx='20' cy='10' r='2'/>",
+                                     {"split", "--units=600"});
     EXPECT_EQ(json.Text("/command"), "split");
     EXPECT_EQ(json.Number("/drawing/units"), 600.0);
     EXPECT_EQ(json.Number("/drawing/width"), 600.0);
@@ -31,7 +31,7 @@ TEST(Program, DescribesTheDrawing)
 
 TEST(Flatten, ALineHasNoDeviation)
 {
-    const Numbers answer = Ask("<path d='M10,10 L310,410'/>", {"flatten", "--tolerance=1"});
+    const Numbers answer = AskCurvelab("<path d='M10,10 L310,410'/>", {"flatten", "--tolerance=1"});
     EXPECT_EQ(answer.Number("/answer/curves"), 1);
     EXPECT_LT(answer.Number("/answer/largestDeviation"), 1e-9);
     EXPECT_GE(answer.Number("/answer/segments"), 2);
@@ -40,7 +40,7 @@ TEST(Flatten, ALineHasNoDeviation)
 TEST(Flatten, TheDeviationOfACircleIsItsSagitta)
 {
     for (const double tolerance : {2000.0, 200.0, 20.0, 2.0}) {
-        const Numbers answer = Ask(circle, {"flatten", "--tolerance", Number(tolerance), "--max-lines=2047"});
+        const Numbers answer = AskCurvelab(circle, {"flatten", "--tolerance", Number(tolerance), "--max-lines=2047"});
         ASSERT_EQ(answer.Number("/answer/curves"), 4);
         const double deviation = answer.Number("/answer/largestDeviation");
         EXPECT_GT(deviation, 0.0);
@@ -59,20 +59,20 @@ TEST(Flatten, TheDeviationOfACircleIsItsSagitta)
 TEST(Flatten, TheBudgetEndsTheSubdivision)
 {
     // Two lines for each quarter: chords of 45 degrees, whatever the tolerance.
-    const Numbers answer = Ask(circle, {"flatten", "--tolerance=0", "--max-lines=2"});
+    const Numbers answer = AskCurvelab(circle, {"flatten", "--tolerance=0", "--max-lines=2"});
     EXPECT_EQ(answer.Number("/answer/segments"), 8);
     EXPECT_NEAR(answer.Number("/answer/largestDeviation"), 50000.0 * (1.0 - std::cos(std::numbers::pi / 8.0)),
                 circleError);
     // One line: chords of a quarter turn.
-    const Numbers chords = Ask(circle, {"flatten", "--tolerance=5", "--max-lines=1"});
+    const Numbers chords = AskCurvelab(circle, {"flatten", "--tolerance=5", "--max-lines=1"});
     EXPECT_EQ(chords.Number("/answer/segments"), 4);
     EXPECT_NEAR(chords.Number("/answer/largestDeviation"), 50000.0 * (1.0 - std::sqrt(0.5)), circleError);
 }
 
 TEST(Flatten, IntegersRoundEachVertexOnce)
 {
-    const Numbers exact = Ask(circle, {"flatten", "--tolerance=3", "--units=1000"});
-    const Numbers whole = Ask(circle, {"flatten", "--tolerance=3", "--units=1000", "--integer"});
+    const Numbers exact = AskCurvelab(circle, {"flatten", "--tolerance=3", "--units=1000"});
+    const Numbers whole = AskCurvelab(circle, {"flatten", "--tolerance=3", "--units=1000", "--integer"});
     EXPECT_EQ(whole.Number("/answer/curves"), 4);
     EXPECT_NE(whole.Number("/answer/largestDeviation"), exact.Number("/answer/largestDeviation"));
     EXPECT_LE(whole.Number("/answer/largestDeviation"), 3.0 + std::sqrt(0.5));
@@ -80,7 +80,7 @@ TEST(Flatten, IntegersRoundEachVertexOnce)
 
 TEST(Split, CutsALineWhereItSays)
 {
-    const Numbers answer = Ask("<path d='M0,0 H400'/>", {"split", "--at=0.25"});
+    const Numbers answer = AskCurvelab("<path d='M0,0 H400'/>", {"split", "--at=0.25"});
     EXPECT_EQ(answer.Number("/answer/pieces"), 2);
     EXPECT_EQ(answer.Number("/answer/largestGap"), 0.0);
     ExpectPoint(answer, "/answer/cuts/0", 25000.0, 0.0, 1e-9);
@@ -89,7 +89,7 @@ TEST(Split, CutsALineWhereItSays)
 
 TEST(Split, CutsAQuarterInItsMiddle)
 {
-    const Numbers answer = Ask(circle, {"split", "--at=0.5"});
+    const Numbers answer = AskCurvelab(circle, {"split", "--at=0.5"});
     ASSERT_EQ(answer.Size("/answer/cuts"), 4u);
     EXPECT_EQ(answer.Number("/answer/largestGap"), 0.0);
     // The construction's factor is chosen so that the middle lies on the circle, at 45 degrees.
@@ -103,7 +103,7 @@ TEST(Split, CutsAQuarterInItsMiddle)
 
 TEST(Split, IntegersAreRoundedOnce)
 {
-    const Numbers answer = Ask(circle, {"split", "--at=0.3", "--integer", "--units=1000"});
+    const Numbers answer = AskCurvelab(circle, {"split", "--at=0.3", "--integer", "--units=1000"});
     EXPECT_EQ(answer.Number("/answer/largestGap"), 0.0);
     EXPECT_GT(answer.Number("/answer/largestRounding"), 0.0);
     EXPECT_LE(answer.Number("/answer/largestRounding"), std::sqrt(0.5) + 1e-12);
@@ -117,7 +117,7 @@ TEST(Closest, OnACircleItIsTheRadialPoint)
         const double c = std::cos(degrees * std::numbers::pi / 180.0), s = std::sin(degrees * std::numbers::pi / 180.0);
         for (const double radius : {80000.0, 20000.0}) {
             const std::string to = Number(centre + radius * c) + "," + Number(centre + radius * s);
-            const Numbers answer = Ask(circle, {"closest", "--to", to});
+            const Numbers answer = AskCurvelab(circle, {"closest", "--to", to});
             EXPECT_NEAR(answer.Number("/answer/distance"), std::abs(radius - 50000.0), circleError);
             // The foot's direction differs as the curve's slope does from the circle's: its radial error comes and goes
             // within 1/6 of the quarter, so the slope is below 1e-2.
@@ -133,28 +133,28 @@ TEST(Closest, OnACircleItIsTheRadialPoint)
 TEST(Closest, OnALineItIsTheFootOfThePerpendicular)
 {
     const std::string line = "<path d='M0,0 H400'/>";
-    const Numbers above = Ask(line, {"closest", "--to=30000,4000"});
+    const Numbers above = AskCurvelab(line, {"closest", "--to=30000,4000"});
     ExpectPoint(above, "/answer/point", 30000.0, 0.0, 1e-6);
     EXPECT_NEAR(above.Number("/answer/distance"), 4000.0, 1e-9);
     EXPECT_NEAR(above.Number("/answer/t"), 0.3, 1e-9);
     EXPECT_EQ(above.Text("/answer/side"), "left");
     EXPECT_EQ(above.Truth("/answer/isFoot"), true);
     EXPECT_EQ(above.Number("/answer/curvesWithFoot"), 1);
-    const Numbers below = Ask(line, {"closest", "--to", "30000,-4000"});
+    const Numbers below = AskCurvelab(line, {"closest", "--to", "30000,-4000"});
     EXPECT_EQ(below.Text("/answer/side"), "right");
 }
 
 TEST(Closest, BeyondALineItIsItsEnd)
 {
     const std::string line = "<path d='M0,0 H400'/>";
-    const Numbers after = Ask(line, {"closest", "--to=103000,4000"});
+    const Numbers after = AskCurvelab(line, {"closest", "--to=103000,4000"});
     ExpectPoint(after, "/answer/point", 100000.0, 0.0, 0.0);
     EXPECT_EQ(after.Number("/answer/distance"), 5000.0);
     EXPECT_EQ(after.Number("/answer/t"), 1.0);
     EXPECT_EQ(after.Text("/answer/side"), "none");
     EXPECT_EQ(after.Truth("/answer/isFoot"), false);
     EXPECT_EQ(after.Number("/answer/curvesWithFoot"), 0);
-    const Numbers before = Ask(line, {"closest", "--to", "-3000,-4000", "--integer"});
+    const Numbers before = AskCurvelab(line, {"closest", "--to", "-3000,-4000", "--integer"});
     EXPECT_EQ(before.Number("/answer/distance"), 5000.0);
     EXPECT_EQ(before.Number("/answer/t"), 0.0);
 }
@@ -168,7 +168,7 @@ TEST(Closest, AFootInTheMiddleOfASymmetricArchIsNotLost)
         const bool isWhole = std::string(integer) == "--integer";
         const double unit = isWhole ? 1000.0 / 3.0 : 1.0;
         const Numbers answer =
-            Ask(arch, {"closest", "--to", Number(150.0 * unit) + "," + Number(300.0 * unit), integer});
+            AskCurvelab(arch, {"closest", "--to", Number(150.0 * unit) + "," + Number(300.0 * unit), integer});
         ExpectPoint(answer, "/answer/point", 150.0 * unit, 225.0 * unit, 1.0);
         EXPECT_NEAR(answer.Number("/answer/distance"), 75.0 * unit, 1.0);
         EXPECT_NEAR(answer.Number("/answer/t"), 0.5, 1e-6);
@@ -184,7 +184,8 @@ TEST(Closest, NothingIsNearerThanTheNearest)
         const double angle = eighth * std::numbers::pi / 8.0;
         const std::string to =
             Number(centre + 90000.0 * std::cos(angle)) + "," + Number(centre + 90000.0 * std::sin(angle));
-        EXPECT_NEAR(Ask(circle, {"closest", "--to", to}).Number("/answer/distance"), 40000.0, circleError) << angle;
+        EXPECT_NEAR(AskCurvelab(circle, {"closest", "--to", to}).Number("/answer/distance"), 40000.0, circleError)
+            << angle;
     }
 }
 
@@ -194,7 +195,7 @@ TEST(Closest, TakesTheNearestOfAllCurves)
     const std::string lines = "<path d='M0,60 H100 M0,30 H100 M0,0 H100'/>";
     for (const auto& [height, curve] :
          std::vector<std::pair<double, int>>{{1000, 0}, {16000, 1}, {44000, 1}, {46000, 2}}) {
-        const Numbers answer = Ask(lines, {"closest", "--to", "70000," + Number(height)});
+        const Numbers answer = AskCurvelab(lines, {"closest", "--to", "70000," + Number(height)});
         EXPECT_EQ(answer.Number("/answer/curve"), curve);
         EXPECT_NEAR(answer.Number("/answer/distance"), std::abs(height - 30000.0 * curve), 1e-6);
         EXPECT_EQ(answer.Number("/answer/curvesWithFoot"), 3);

@@ -27,7 +27,7 @@ constexpr const char* twoInflections = "<path d='M0,0 C-283.3333333333333,150 -2
 
 TEST(Curvature, OfACircleIsThatOfItsQuarters)
 {
-    const Numbers answer = Ask(circle, {"curvature"});
+    const Numbers answer = AskCurvelab(circle, {"curvature"});
     // At its ends a quarter has 2/3*Cross(P1 - P0, P2 - P1)/|P1 - P0|^3, and nowhere less. Circles run clockwise.
     const double atEnds = -2.0 / 3.0 * (1.0 - kappa) / (kappa * kappa) / radius;
     ASSERT_EQ(answer.Size("/answer/weakestOfCurve"), 4u);
@@ -42,7 +42,7 @@ TEST(Curvature, OfACircleIsThatOfItsQuarters)
 
 TEST(Curvature, OfASquareThereIsNone)
 {
-    const Numbers answer = Ask(square, {"curvature"});
+    const Numbers answer = AskCurvelab(square, {"curvature"});
     EXPECT_EQ(answer.Number("/answer/straightCurves"), 4);
     EXPECT_EQ(answer.Number("/answer/strongest"), 0.0);
     EXPECT_EQ(answer.Number("/answer/teeth"), 0);
@@ -52,7 +52,7 @@ TEST(Curvature, OfASquareThereIsNone)
 TEST(Curvature, OfAParabolaIsStrongestWhereItIsSlowest)
 {
     // y = x^2/100 from x = -100 to 200, with x uniform in t; 250 drawing units to one of the file.
-    const Numbers answer = Ask("<path d='M-100,-100 Q50,200 200,-400'/>", {"curvature"});
+    const Numbers answer = AskCurvelab("<path d='M-100,-100 Q50,200 200,-400'/>", {"curvature"});
     ASSERT_EQ(answer.Number("/answer/speedExtremes"), 1);
     ExpectPoint(answer, "/answer/speedExtremeAt/0", 25000.0, 0.0, 1e-3);
     EXPECT_NEAR(answer.Number("/answer/speedExtremeT/0"), 1.0 / 3.0, 1e-9);
@@ -63,7 +63,7 @@ TEST(Curvature, OfAParabolaIsStrongestWhereItIsSlowest)
 
 TEST(Curvature, ListsInflections)
 {
-    const Numbers answer = Ask(twoInflections, {"curvature"});
+    const Numbers answer = AskCurvelab(twoInflections, {"curvature"});
     ASSERT_EQ(answer.Number("/answer/inflections"), 2);
     EXPECT_EQ(answer.Number("/answer/missedInflections"), 0);
     EXPECT_EQ(answer.Number("/answer/strayInflections"), 0);
@@ -75,7 +75,7 @@ TEST(Curvature, ListsInflections)
 TEST(Curvature, FindsTheInflectionOfASymmetricS)
 {
     // Its quadratic has no leading term, or one of rounding: the middle is the only root, and the closed form loses it.
-    const Numbers answer = Ask("<path d='M0,0 C100,-300 200,300 300,0'/>", {"curvature"});
+    const Numbers answer = AskCurvelab("<path d='M0,0 C100,-300 200,300 300,0'/>", {"curvature"});
     ASSERT_EQ(answer.Number("/answer/inflections"), 1);
     EXPECT_EQ(answer.Number("/answer/missedInflections"), 1);
     EXPECT_NEAR(answer.Number("/answer/inflectionT/0"), 0.5, 1e-9);
@@ -84,7 +84,7 @@ TEST(Curvature, FindsTheInflectionOfASymmetricS)
 
 TEST(Length, OfASquareIsFourSides)
 {
-    const Numbers answer = Ask(square, {"length", "--spacing=25000"});
+    const Numbers answer = AskCurvelab(square, {"length", "--spacing=25000"});
     EXPECT_NEAR(answer.Number("/answer/length"), 400000.0, 1e-6);
     EXPECT_NEAR(answer.Number("/answer/polylineLength"), 400000.0, 1e-6);
     ASSERT_EQ(answer.Number("/answer/points"), 16);
@@ -100,18 +100,18 @@ TEST(Length, OfASquareIsFourSides)
 
 TEST(Length, OfAnOpenLineIncludesBothEnds)
 {
-    const Numbers answer = Ask("<path d='M0,0 H400'/>", {"length", "--spacing=25000"});
+    const Numbers answer = AskCurvelab("<path d='M0,0 H400'/>", {"length", "--spacing=25000"});
     ASSERT_EQ(answer.Number("/answer/points"), 5);
     for (int i = 0; i < 5; ++i)
         ExpectPoint(answer, "/answer/marks/" + std::to_string(i), 25000.0 * i, 0.0, 0.05);
     // What is left at the end is shorter than a step.
-    EXPECT_EQ(Ask("<path d='M0,0 H400'/>", {"length", "--spacing=30000"}).Number("/answer/points"), 4);
-    EXPECT_EQ(Ask("<path d='M0,0 H400'/>", {"length", "--spacing=1e9"}).Number("/answer/points"), 1);
+    EXPECT_EQ(AskCurvelab("<path d='M0,0 H400'/>", {"length", "--spacing=30000"}).Number("/answer/points"), 4);
+    EXPECT_EQ(AskCurvelab("<path d='M0,0 H400'/>", {"length", "--spacing=1e9"}).Number("/answer/points"), 1);
 }
 
 TEST(Length, OfACircleIsItsCircumference)
 {
-    const Numbers answer = Ask(circle, {"length", "--spacing=40000"});
+    const Numbers answer = AskCurvelab(circle, {"length", "--spacing=40000"});
     const double around = 2.0 * std::numbers::pi * radius;
     EXPECT_GT(answer.Number("/answer/length"), around);
     EXPECT_NEAR(answer.Number("/answer/length"), around, quarterError * around);
@@ -131,7 +131,7 @@ TEST(Length, OfACircleIsItsCircumference)
 TEST(Length, CountsEveryContour)
 {
     const Numbers answer =
-        Ask("<path d='M0,0 H100 M0,30 H50'/>", {"length", "--spacing=10000", "--integer", "--units=1000000"});
+        AskCurvelab("<path d='M0,0 H100 M0,30 H50'/>", {"length", "--spacing=10000", "--integer", "--units=1000000"});
     EXPECT_EQ(answer.Size("/answer/lengthOfContour"), 2u);
     EXPECT_NEAR(answer.Number("/answer/lengthOfContour/0"), 1000000.0, 1e-5);
     EXPECT_NEAR(answer.Number("/answer/lengthOfContour/1"), 500000.0, 1e-5);
@@ -140,12 +140,12 @@ TEST(Length, CountsEveryContour)
 
 TEST(Area, OfASquareHasTheSignOfItsDirection)
 {
-    const Numbers clockwise = Ask(square, {"area"});
+    const Numbers clockwise = AskCurvelab(square, {"area"});
     EXPECT_NEAR(clockwise.Number("/answer/area"), 1e10, 1.0);
     EXPECT_NEAR(clockwise.Number("/answer/polygonArea"), 1e10, 1.0);
     EXPECT_EQ(clockwise.Number("/answer/clockwise"), 1);
     EXPECT_EQ(clockwise.Number("/answer/counterClockwise"), 0);
-    const Numbers reversed = Ask("<path d='M0,0 V100 H100 V0 Z'/>", {"area", "--integer"});
+    const Numbers reversed = AskCurvelab("<path d='M0,0 V100 H100 V0 Z'/>", {"area", "--integer"});
     EXPECT_NEAR(reversed.Number("/answer/area"), -1e10, 1.0);
     EXPECT_EQ(reversed.Number("/answer/clockwise"), 0);
     EXPECT_EQ(reversed.Number("/answer/counterClockwise"), 1);
@@ -153,7 +153,7 @@ TEST(Area, OfASquareHasTheSignOfItsDirection)
 
 TEST(Area, OfACircleIsThatOfItsQuarters)
 {
-    const Numbers answer = Ask(circle, {"area"});
+    const Numbers answer = AskCurvelab(circle, {"area"});
     // The sector of a quarter with arms k has (10 + 12*k - 3*k^2)/20, by the cross products of its control points.
     const double exact = radius * radius * (10.0 + 12.0 * kappa - 3.0 * kappa * kappa) / 5.0;
     EXPECT_NEAR(answer.Number("/answer/area"), exact, 1e-11 * exact);
@@ -164,7 +164,7 @@ TEST(Area, OfACircleIsThatOfItsQuarters)
 
 TEST(Area, OfAHoleIsSubtracted)
 {
-    const Numbers answer = Ask("<path d='M0,0 H100 V100 H0 Z M20,20 V80 H80 V20 Z'/>", {"area"});
+    const Numbers answer = AskCurvelab("<path d='M0,0 H100 V100 H0 Z M20,20 V80 H80 V20 Z'/>", {"area"});
     EXPECT_NEAR(answer.Number("/answer/area"), (1.0 - 0.36) * 1e10, 1.0);
     EXPECT_EQ(answer.Number("/answer/clockwise"), 1);
     EXPECT_EQ(answer.Number("/answer/counterClockwise"), 1);
@@ -172,14 +172,14 @@ TEST(Area, OfAHoleIsSubtracted)
 
 TEST(Area, OfAFigureOfEightCancels)
 {
-    const Numbers answer = Ask("<path d='M0,0 L100,100 L100,0 L0,100 Z'/>", {"area"});
+    const Numbers answer = AskCurvelab("<path d='M0,0 L100,100 L100,0 L0,100 Z'/>", {"area"});
     EXPECT_EQ(answer.Number("/answer/closedContours"), 1);
     EXPECT_NEAR(answer.Number("/answer/area"), 0.0, 1.0);
 }
 
 TEST(Area, LeavesOpenContoursOut)
 {
-    const Numbers answer = Ask("<path d='M0,0 H100 V100 H0 Z M0,0 C0,50 50,100 100,100'/>", {"area"});
+    const Numbers answer = AskCurvelab("<path d='M0,0 H100 V100 H0 Z M0,0 C0,50 50,100 100,100'/>", {"area"});
     EXPECT_EQ(answer.Number("/answer/closedContours"), 1);
     EXPECT_EQ(answer.Number("/answer/openContours"), 1);
     EXPECT_NEAR(answer.Number("/answer/area"), 1e10, 1.0);
@@ -188,7 +188,7 @@ TEST(Area, LeavesOpenContoursOut)
 TEST(Bounds, OfAnArchAreTight)
 {
     // y = 3*t*(1 - t) of the height of its control points has its maximum, three quarters, in the middle.
-    const Numbers answer = Ask("<path d='M0,0 C0,-100 100,-100 100,0'/>", {"bounds"});
+    const Numbers answer = AskCurvelab("<path d='M0,0 C0,-100 100,-100 100,0'/>", {"bounds"});
     ExpectPoint(answer, "/answer/lowerLeft", 0.0, 0.0, 1e-9);
     ExpectPoint(answer, "/answer/upperRight", 100000.0, 75000.0, 1e-9);
     EXPECT_NEAR(answer.Number("/answer/controlHeight"), 100000.0, 1e-9);
@@ -201,7 +201,7 @@ TEST(Bounds, OfAnArchAreTight)
 TEST(Bounds, HoldBothExtremesOfX)
 {
     // x of 0, 1, -1, 0 is 3*t - 9*t^2 + 6*t^3, with extremes of sqrt(3)/6 on either side.
-    const Numbers answer = Ask("<path d='M0,0 C1,-1 -1,-2 0,-3'/>", {"bounds"});
+    const Numbers answer = AskCurvelab("<path d='M0,0 C1,-1 -1,-2 0,-3'/>", {"bounds"});
     EXPECT_EQ(answer.Number("/answer/extremesOfX"), 2);
     EXPECT_NEAR(answer.Number("/answer/width"), 100000.0 / 3.0 * std::numbers::sqrt3 / 3.0, 1e-6);
     EXPECT_NEAR(answer.Number("/answer/height"), 100000.0, 1e-6);
@@ -210,7 +210,7 @@ TEST(Bounds, HoldBothExtremesOfX)
 
 TEST(Bounds, AreThoseOfEachContour)
 {
-    const Numbers answer = Ask("<path d='M0,0 H100 V40 H0 Z'/><circle cx='50' cy='70' r='30'/>", {"bounds"});
+    const Numbers answer = AskCurvelab("<path d='M0,0 H100 V40 H0 Z'/><circle cx='50' cy='70' r='30'/>", {"bounds"});
     ASSERT_EQ(answer.Size("/answer/lowerLeftOfContour"), 2u);
     ExpectPoint(answer, "/answer/lowerLeftOfContour/0", 0.0, 60000.0, 1e-6);
     ExpectPoint(answer, "/answer/upperRightOfContour/0", 100000.0, 100000.0, 1e-6);
@@ -223,6 +223,6 @@ TEST(Bounds, OfIntegersAreThoseOfRoundedControlPoints)
 {
     // Control points at a height of 7.7 units are rounded to 8, and the arch is three quarters of that.
     const std::string arch = "<path d='M0,0 C0,-77 100,-77 100,0'/>";
-    EXPECT_NEAR(Ask(arch, {"bounds", "--units=10"}).Number("/answer/height"), 0.75 * 7.7, 1e-12);
-    EXPECT_EQ(Ask(arch, {"bounds", "--units=10", "--integer"}).Number("/answer/height"), 6.0);
+    EXPECT_NEAR(AskCurvelab(arch, {"bounds", "--units=10"}).Number("/answer/height"), 0.75 * 7.7, 1e-12);
+    EXPECT_EQ(AskCurvelab(arch, {"bounds", "--units=10", "--integer"}).Number("/answer/height"), 6.0);
 }

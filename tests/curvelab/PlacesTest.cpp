@@ -37,7 +37,7 @@ TEST(Intersect, TwoCirclesCrossTwice)
     // Radii of 50 with centres 60 apart cross 40 above and below the line of the centres; 625 units to one of the file.
     const std::string circles = "<circle cx='50' cy='50' r='50'/><circle cx='110' cy='50' r='50'/>";
     for (const char* option : {"--units=100000", "--integer"}) {
-        const Numbers answer = Ask(circles, {"intersect", option});
+        const Numbers answer = AskCurvelab(circles, {"intersect", option});
         EXPECT_EQ(answer.Number("/answer/crossings"), 2);
         EXPECT_EQ(answer.Number("/answer/selfCrossings"), 0);
         EXPECT_EQ(answer.Number("/answer/contacts"), 0);
@@ -53,7 +53,7 @@ TEST(Intersect, NeighboursDoNotCrossWhereTheyMeet)
 {
     for (const char* closed :
          {"<path d='M0,0 H100 V100 H0 Z'/>", circle, "<path d='M0,0 C0,50 50,100 100,100 S200,50 200,0'/>"}) {
-        const Numbers answer = Ask(closed, {"intersect"});
+        const Numbers answer = AskCurvelab(closed, {"intersect"});
         EXPECT_EQ(answer.Number("/answer/crossings"), 0) << closed;
         EXPECT_EQ(answer.Number("/answer/contacts"), 0) << closed;
     }
@@ -61,7 +61,7 @@ TEST(Intersect, NeighboursDoNotCrossWhereTheyMeet)
 
 TEST(Intersect, APolygonCrossesItself)
 {
-    const Numbers answer = Ask("<path d='M0,0 L100,100 L100,0 L0,100 Z'/>", {"intersect"});
+    const Numbers answer = AskCurvelab("<path d='M0,0 L100,100 L100,0 L0,100 Z'/>", {"intersect"});
     ASSERT_EQ(answer.Number("/answer/crossings"), 1);
     ExpectPoint(answer, "/answer/points/0", 50000.0, 50000.0, 1e-6);
     EXPECT_NEAR(answer.Number("/answer/firstT/0"), 0.5, 1e-9);
@@ -71,7 +71,7 @@ TEST(Intersect, APolygonCrossesItself)
 TEST(Intersect, AFigureOfEightCrossesInItsMiddle)
 {
     // Two S that share their ends and cross at t = 1/2 of both, where the library's search makes its first cut.
-    const Numbers answer = Ask("<path d='M0,50 C0,-50 200,150 200,50 C200,-50 0,150 0,50 Z'/>", {"intersect"});
+    const Numbers answer = AskCurvelab("<path d='M0,50 C0,-50 200,150 200,50 C200,-50 0,150 0,50 Z'/>", {"intersect"});
     ASSERT_EQ(answer.Number("/answer/crossings"), 1);
     EXPECT_NEAR(answer.Number("/answer/points/0/0"), 50000.0, 1e-3);
     EXPECT_NEAR(answer.Number("/answer/points/0/1"), answer.Number("/drawing/height") / 2.0, 1e-3);
@@ -82,7 +82,7 @@ TEST(Intersect, OneCurveCrossesItself)
 {
     // By symmetry the loop 0,0 300,300 -100,300 200,0 crosses on its axis; x(t) = 900*t - 2100*t^2 + 1400*t^3 is 100 where
     // 14*t^2 - 14*t + 2 vanishes, besides t = 1/2, and y = 900*t*(1 - t) is 900/7 there.
-    const Numbers answer = Ask("<path d='M0,0 C300,-300 -100,-300 200,0'/>", {"intersect"});
+    const Numbers answer = AskCurvelab("<path d='M0,0 C300,-300 -100,-300 200,0'/>", {"intersect"});
     ASSERT_EQ(answer.Number("/answer/crossings"), 1);
     EXPECT_EQ(answer.Number("/answer/selfCrossings"), 1);
     EXPECT_EQ(answer.Number("/answer/magnifiedLoops"), 0);
@@ -96,7 +96,7 @@ TEST(Intersect, OneCurveCrossesItself)
 
 TEST(Intersect, FindsALoopThatIsTooSmallForTheLibrary)
 {
-    const Numbers answer = Ask("<path d='M0,0 C300,-300 -100,-300 200,0'/>", {"intersect", "--units=20"});
+    const Numbers answer = AskCurvelab("<path d='M0,0 C300,-300 -100,-300 200,0'/>", {"intersect", "--units=20"});
     EXPECT_EQ(answer.Number("/answer/magnifiedLoops"), 1);
     ASSERT_EQ(answer.Number("/answer/selfCrossings"), 1);
     EXPECT_NEAR(answer.Number("/answer/points/0/0"), answer.Number("/drawing/width") / 2.0, 0.01);
@@ -107,7 +107,7 @@ TEST(Intersect, ParabolasCross)
     // y = 400*u*(1 - u) and its mirror image y = 100 - 400*u*(1 - u), with x = 400*u: where u*(1 - u) = 1/8. On this grid
     // none of them has a cubic term, not even by rounding.
     const std::string parabolas = "<path d='M0,0 Q200,-200 400,0 M0,-100 Q200,100 400,-100'/>";
-    const Numbers answer = Ask(parabolas, {"intersect", "--units=120000", "--integer"});
+    const Numbers answer = AskCurvelab(parabolas, {"intersect", "--units=120000", "--integer"});
     EXPECT_EQ(answer.Number("/answer/bentPairs"), 1);
     ASSERT_EQ(answer.Number("/answer/crossings"), 2);
     const double half = std::sqrt(1.0 / 4.0 - 1.0 / 8.0);
@@ -118,7 +118,7 @@ TEST(Intersect, ParabolasCross)
 TEST(Intersect, TellsContactsFromCrossings)
 {
     // A letter T: the end of the stem lies on the bar.
-    const Numbers answer = Ask("<path d='M0,0 H100 M40,0 V70'/>", {"intersect"});
+    const Numbers answer = AskCurvelab("<path d='M0,0 H100 M40,0 V70'/>", {"intersect"});
     EXPECT_EQ(answer.Number("/answer/crossings"), 0);
     ASSERT_EQ(answer.Number("/answer/contacts"), 1);
     ExpectPoint(answer, "/answer/pointsOfContacts/0", 40000.0, 70000.0, 1e-6);
@@ -127,20 +127,20 @@ TEST(Intersect, TellsContactsFromCrossings)
 TEST(Intersect, AJointOnAnotherCurveIsOnePlace)
 {
     // A line through the centre of a circle meets it where two of its quarters join, on either side.
-    const Numbers answer = Ask("<circle cx='100' cy='100' r='50'/><path d='M0,100 H200'/>", {"intersect"});
+    const Numbers answer = AskCurvelab("<circle cx='100' cy='100' r='50'/><path d='M0,100 H200'/>", {"intersect"});
     EXPECT_EQ(answer.Number("/answer/crossings") + answer.Number("/answer/contacts"), 2);
 }
 
 TEST(Intersect, CurvesThatRunTogetherDoNotCross)
 {
-    const Numbers answer = Ask(std::string(circle) + circle, {"intersect"});
+    const Numbers answer = AskCurvelab(std::string(circle) + circle, {"intersect"});
     EXPECT_EQ(answer.Number("/answer/crossings"), 0);
 }
 
 TEST(Tangents, TouchACircleAtItsPolar)
 {
     // From twice the radius the tangents touch 60 degrees off.
-    const Numbers answer = Ask(circle, {"tangents", "--to=150000,50000"});
+    const Numbers answer = AskCurvelab(circle, {"tangents", "--to=150000,50000"});
     ASSERT_EQ(answer.Number("/answer/tangents"), 2);
     // The slope of a quarter's radial error is below 1e-2, so that its tangents turn by less than that.
     const double tolerance = 0.01 * radius;
@@ -155,7 +155,7 @@ TEST(Tangents, OfAParabolaTouchSymmetrically)
     // y = x^2 from -2 to 2, 25000 units to one: the tangents through (0, -1) touch at x = -1 and 1.
     for (const char* option : {"--units=100000", "--integer"}) {
         const Numbers answer =
-            Ask("<path d='M-200,-400 Q0,400 200,-400'/>", {"tangents", "--to", "50000,-25000", option});
+            AskCurvelab("<path d='M-200,-400 Q0,400 200,-400'/>", {"tangents", "--to", "50000,-25000", option});
         const double tolerance = option == std::string("--integer") ? 2.0 : 1e-3;
         ExpectAll(Coordinates(answer, "/answer/points", 0), {25000.0, 75000.0}, tolerance);
         ExpectAll(Coordinates(answer, "/answer/points", 1), {25000.0, 25000.0}, tolerance);
@@ -165,8 +165,10 @@ TEST(Tangents, OfAParabolaTouchSymmetrically)
 
 TEST(Tangents, ThereAreNoneFromWithinOrToLines)
 {
-    EXPECT_EQ(Ask(circle, {"tangents", "--to=50000,60000"}).Number("/answer/tangents"), 0);
-    EXPECT_EQ(Ask("<path d='M0,0 H100 V100 H0 Z'/>", {"tangents", "--to=-7000,250000"}).Number("/answer/tangents"), 0);
+    EXPECT_EQ(AskCurvelab(circle, {"tangents", "--to=50000,60000"}).Number("/answer/tangents"), 0);
+    EXPECT_EQ(
+        AskCurvelab("<path d='M0,0 H100 V100 H0 Z'/>", {"tangents", "--to=-7000,250000"}).Number("/answer/tangents"),
+        0);
 }
 
 namespace {
@@ -180,7 +182,7 @@ TEST(Cusps, OfAnEllipseLieOnItsEvolute)
 {
     constexpr double a = 50000.0, b = 25000.0, distance = 30000.0;
     // Ellipses run clockwise: the inner side is on the right.
-    const Numbers answer = Ask(ellipse, {"cusps", "--distance", Number(-distance)});
+    const Numbers answer = AskCurvelab(ellipse, {"cusps", "--distance", Number(-distance)});
     ASSERT_EQ(answer.Number("/answer/cusps"), 4);
     EXPECT_EQ(answer.Number("/answer/curvesWithCusp"), 4);
     EXPECT_EQ(answer.Number("/answer/turns"), 4);
@@ -198,7 +200,7 @@ TEST(Cusps, OfAnEllipseLieOnItsEvolute)
 TEST(Cusps, ThereAreNoneOutsideOrNearOrFar)
 {
     for (const char* distance : {"30000", "-10000", "-110000", "0"}) {
-        const Numbers answer = Ask(ellipse, {"cusps", "--distance", distance});
+        const Numbers answer = AskCurvelab(ellipse, {"cusps", "--distance", distance});
         EXPECT_EQ(answer.Number("/answer/cusps"), 0) << distance;
         EXPECT_EQ(answer.Number("/answer/turns"), 0) << distance;
     }
@@ -206,7 +208,7 @@ TEST(Cusps, ThereAreNoneOutsideOrNearOrFar)
 
 TEST(Cusps, OfLinesThereAreNone)
 {
-    const Numbers answer = Ask("<path d='M0,0 H100 V100 H0 Z'/>", {"cusps", "--distance=-1000", "--integer"});
+    const Numbers answer = AskCurvelab("<path d='M0,0 H100 V100 H0 Z'/>", {"cusps", "--distance=-1000", "--integer"});
     EXPECT_EQ(answer.Number("/answer/cusps"), 0);
     EXPECT_EQ(answer.Number("/answer/curves"), 4);
 }

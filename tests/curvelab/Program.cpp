@@ -152,7 +152,7 @@ std::string ContentOf(const fs::path& path)
     return content.str();
 }
 
-Numbers Ask(const std::string& content, std::vector<std::string> arguments)
+Numbers AskCurvelab(const std::string& content, std::vector<std::string> arguments)
 {
     const TemporaryFolder folder;
     arguments.insert(arguments.begin() + 1, folder.WriteSvg(content));

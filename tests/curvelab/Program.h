@@ -81,7 +81,7 @@ private:
 ///
 /// @param content   what stands in the root of the SVG file
 /// @param arguments the command's name and its options
-[[nodiscard]] Numbers Ask(const std::string& content, std::vector<std::string> arguments);
+[[nodiscard]] Numbers AskCurvelab(const std::string& content, std::vector<std::string> arguments);
 
 /// A number as an argument, to the last bit.
 [[nodiscard]] std::string Number(double value);

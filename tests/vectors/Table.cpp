@@ -32,19 +32,33 @@ const Table::Entry* Table::Find(const std::string& name) const
 Table MakeTable()
 {
     Table table;
+    AddAnglesAdapters(table);
+    AddBatchesAdapters(table);
     AddBezierToLinesAdapters(table);
     AddBoundsAdapters(table);
+    AddCircleAdapters(table);
+    AddClassificationAdapters(table);
     AddClosestPointAdapters(table);
+    AddConstructorsAdapters(table);
     AddCurvatureAdapters(table);
     AddCuttingAdapters(table);
+    AddDecompositionAdapters(table);
     AddExtentsAdapters(table);
-    AddLengthAdapters(table);
     AddIntersectionAdapters(table);
+    AddIntervalVectorAdapters(table);
+    AddLayoutAdapters(table);
+    AddLengthAdapters(table);
     AddLineAdapters(table);
+    AddMatrixAdapters(table);
+    AddNumericAdapters(table);
     AddPlatformAdapters(table);
     AddRootFinderAdapters(table);
     AddSelfIntersectionAdapters(table);
+    AddTransformedBoundsAdapters(table);
+    AddTridiagonalMatrixAdapters(table);
     AddValueTypesAdapters(table);
+    AddVectorFieldAdapters(table);
+    AddWMath3DAdapters(table);
     return table;
 }
 

@@ -64,19 +64,33 @@ Table MakeTable();
 
 /// @name One function a unit, in <Unit>Adapters.cpp
 /// @{
+void AddAnglesAdapters(Table& table);
+void AddBatchesAdapters(Table& table);
 void AddBezierToLinesAdapters(Table& table);
 void AddBoundsAdapters(Table& table);
+void AddCircleAdapters(Table& table);
+void AddClassificationAdapters(Table& table);
 void AddClosestPointAdapters(Table& table);
+void AddConstructorsAdapters(Table& table);
 void AddCurvatureAdapters(Table& table);
 void AddCuttingAdapters(Table& table);
+void AddDecompositionAdapters(Table& table);
 void AddExtentsAdapters(Table& table);
-void AddLengthAdapters(Table& table);
 void AddIntersectionAdapters(Table& table);
+void AddIntervalVectorAdapters(Table& table);
+void AddLayoutAdapters(Table& table);
+void AddLengthAdapters(Table& table);
 void AddLineAdapters(Table& table);
+void AddMatrixAdapters(Table& table);
+void AddNumericAdapters(Table& table);
 void AddPlatformAdapters(Table& table);
 void AddRootFinderAdapters(Table& table);
 void AddSelfIntersectionAdapters(Table& table);
+void AddTransformedBoundsAdapters(Table& table);
+void AddTridiagonalMatrixAdapters(Table& table);
 void AddValueTypesAdapters(Table& table);
+void AddVectorFieldAdapters(Table& table);
+void AddWMath3DAdapters(Table& table);
 /// @}
 
 /// Runs one case.

@@ -1,0 +1,174 @@
+#include "ZarnMath/VectorField.h"
+
+#include "ZarnMath/Bounds.h"
+#include "ZarnMath/ValueTypesInternal.h"
+
+#include <algorithm>
+#include <utility>
+
+namespace ZarnMath {
+
+namespace {
+
+using Vector = vector2dT<float, false>;
+
+/// The number of cells from low to high, both included: 0 where they are inside out, at most the largest integer.
+int CellsBetween(int low, int high) noexcept
+{
+    const std::int64_t cells = std::int64_t{high} - low + 1;
+    return static_cast<int>(std::clamp<std::int64_t>(cells, 0, std::numeric_limits<int>::max()));
+}
+
+/// The inclusive bounds of a grid.
+RECT BoundsFrom(int x, int y, int width, int height) noexcept
+{
+    return {x, WrappingSubtract(WrappingAdd(y, height), 1), WrappingSubtract(WrappingAdd(x, width), 1), y};
+}
+
+/// Into [0, limit]; NaN, which is not below 0 and not within the limit, becomes the limit.
+float Clamp(float v, float limit) noexcept
+{
+    if (v < 0.0F)
+        return 0.0F;
+    return v <= limit ? v : limit;
+}
+
+Vector Interpolate(const Vector& a, const Vector& b, float t) noexcept
+{
+    return a + (b - a) * t;
+}
+
+/// Between columns i and i + 1 of a row. A column before the first one, and one beyond the last, reads as zero.
+Vector InterpolateColumns(const VectorField::Row& row, std::int64_t i, float t) noexcept
+{
+    const auto column = static_cast<std::uint64_t>(i);
+    return Interpolate(row[column], row[column + 1], t);
+}
+
+} // namespace
+
+VectorField::VectorField(VectorField&& other) noexcept
+    : rows(std::move(other.rows)), width(other.width), height(other.height), originX(other.originX),
+      originY(other.originY)
+{}
+
+VectorField& VectorField::operator=(VectorField&& other) noexcept
+{
+    rows = std::exchange(other.rows, {});
+    width = other.width;
+    height = other.height;
+    originX = other.originX;
+    originY = other.originY;
+    return *this;
+}
+
+void VectorField::Initialize(int columns, int lines, int x, int y)
+{
+    const bool hasCells = columns >= 1 && lines >= 1;
+    rows.clear();
+    // Until the rows stand the field is the empty one, and so it stays if there is no memory for them.
+    width = height = originX = originY = 0;
+    if (!hasCells) {
+        std::vector<Row>().swap(rows);
+        return;
+    }
+    rows.resize(static_cast<std::size_t>(lines), Row(Vector{}, static_cast<std::uint64_t>(columns)));
+    width = columns;
+    height = lines;
+    originX = x;
+    originY = y;
+}
+
+void VectorField::Initialize(const RECT& rect)
+{
+    Initialize(CellsBetween(rect.left, rect.right), CellsBetween(rect.bottom, rect.top), rect.left, rect.bottom);
+}
+
+void VectorField::ClearVectors() noexcept
+{
+    for (Row& row : rows)
+        row.clear_section(row.start, row.end);
+}
+
+bool VectorField::Rebound(const RECT& rect)
+{
+    VectorField rebound;
+    rebound.Initialize(rect);
+    const bool isComplete = rebound.Blit(*this, 0, 0);
+    *this = std::move(rebound);
+    return isComplete;
+}
+
+bool VectorField::Extend(const RECT& rect)
+{
+    const RECT bounds = GetZGIRECT();
+    RECT united = bounds;
+    UnionRect(united, rect);
+    if (united == bounds)
+        return false;
+    Rebound(united);
+    return true;
+}
+
+RECT VectorField::GetZGIRECT() const noexcept
+{
+    return BoundsFrom(originX, originY, width, height);
+}
+
+bool VectorField::Blit(const VectorField& source, int dx, int dy)
+{
+    if (&source == this)
+        return Blit(VectorField(source), dx, dy);
+    if (source.width < 1 || source.height < 0)
+        return true;
+    if (width < 1 || height < 1)
+        return false;
+    const int ox = WrappingAdd(WrappingSubtract(source.originX, originX), dx);
+    const int oy = WrappingAdd(WrappingSubtract(source.originY, originY), dy);
+    if (ox >= width || oy >= height)
+        return false;
+    const int endX = WrappingAdd(ox, source.width);
+    const int endY = WrappingAdd(oy, source.height);
+    for (int r = std::max(oy, 0); r < std::min(height, endY); ++r)
+        rows[static_cast<std::size_t>(r)].fast_blit_from_another(source.rows[static_cast<std::size_t>(r - oy)], ox);
+    return ox >= 0 && oy >= 0 && endY <= height && endX <= width;
+}
+
+bool VectorField::BlitExtend(const VectorField& source, int dx, int dy)
+{
+    if (&source == this)
+        return BlitExtend(VectorField(source), dx, dy);
+    const bool hasGrown = Extend(
+        BoundsFrom(WrappingAdd(source.originX, dx), WrappingAdd(source.originY, dy), source.width, source.height));
+    Blit(source, dx, dy);
+    return hasGrown;
+}
+
+VectorField VectorField::GetRegion(const RECT& rect)
+{
+    VectorField region;
+    RECT shared = GetZGIRECT();
+    if (height < 1 || width < 1 || !IntersectRect(shared, rect))
+        return region;
+    region.Initialize(shared);
+    region.Blit(*this, 0, 0);
+    return region;
+}
+
+Vector VectorField::Get(vector2dT<float, true> position) const noexcept
+{
+    const float fx = Clamp(position.x - static_cast<float>(originX), static_cast<float>(width) - 2.0F);
+    const float fy = Clamp(position.y - static_cast<float>(originY), static_cast<float>(height) - 2.0F);
+    // A size above 2^24 can round upward as a float. 64 bits hold any column then, and the last row stands in for those
+    // beyond it.
+    const auto ix = static_cast<std::int64_t>(fx);
+    const auto iy = static_cast<std::int64_t>(fy);
+    const auto row = [this](std::int64_t i) -> const Row& {
+        return rows[static_cast<std::size_t>(std::min<std::int64_t>(i, height - 1))];
+    };
+    const float tx = fx - static_cast<float>(ix);
+    const float ty = fy - static_cast<float>(iy);
+    return Interpolate(InterpolateColumns(row(iy), ix, tx), InterpolateColumns(row(iy + 1), ix, tx), ty);
+}
+
+} // namespace ZarnMath
