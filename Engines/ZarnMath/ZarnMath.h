@@ -6,6 +6,7 @@
 #include "ZarnMath/BezierToLines.h"
 #include "ZarnMath/Bounds.h"
 #include "ZarnMath/Circle.h"
+#include "ZarnMath/FitBezier.h"
 #include "ZarnMath/FitLine.h"
 #include "ZarnMath/Line.h"
 #include "ZarnMath/PlainC.h"

@@ -44,6 +44,7 @@ Table MakeTable()
     AddCuttingAdapters(table);
     AddDecompositionAdapters(table);
     AddExtentsAdapters(table);
+    AddFitBezierAdapters(table);
     AddIntersectionAdapters(table);
     AddLengthAdapters(table);
     AddLineAdapters(table);

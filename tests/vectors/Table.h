@@ -76,6 +76,7 @@ void AddCurvatureAdapters(Table& table);
 void AddCuttingAdapters(Table& table);
 void AddDecompositionAdapters(Table& table);
 void AddExtentsAdapters(Table& table);
+void AddFitBezierAdapters(Table& table);
 void AddIntersectionAdapters(Table& table);
 void AddLengthAdapters(Table& table);
 void AddLineAdapters(Table& table);
