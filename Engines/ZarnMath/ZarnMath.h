@@ -3,6 +3,7 @@
 #pragma once
 
 #include "ZarnMath/Bezier.h"
+#include "ZarnMath/BezierOffset.h"
 #include "ZarnMath/BezierToLines.h"
 #include "ZarnMath/Bounds.h"
 #include "ZarnMath/Circle.h"

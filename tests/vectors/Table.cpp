@@ -34,6 +34,7 @@ Table MakeTable()
     Table table;
     AddAnglesAdapters(table);
     AddBatchesAdapters(table);
+    AddBezierOffsetAdapters(table);
     AddBezierToLinesAdapters(table);
     AddBoundsAdapters(table);
     AddCircleAdapters(table);

@@ -66,6 +66,7 @@ Table MakeTable();
 /// @{
 void AddAnglesAdapters(Table& table);
 void AddBatchesAdapters(Table& table);
+void AddBezierOffsetAdapters(Table& table);
 void AddBezierToLinesAdapters(Table& table);
 void AddBoundsAdapters(Table& table);
 void AddCircleAdapters(Table& table);
