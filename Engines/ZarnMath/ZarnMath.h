@@ -3,9 +3,11 @@
 #pragma once
 
 #include "ZarnMath/Bezier.h"
+#include "ZarnMath/BezierOffset.h"
 #include "ZarnMath/BezierToLines.h"
 #include "ZarnMath/Bounds.h"
 #include "ZarnMath/Circle.h"
+#include "ZarnMath/FitBezier.h"
 #include "ZarnMath/FitLine.h"
 #include "ZarnMath/Layout.h"
 #include "ZarnMath/Line.h"

@@ -34,6 +34,7 @@ Table MakeTable()
     Table table;
     AddAnglesAdapters(table);
     AddBatchesAdapters(table);
+    AddBezierOffsetAdapters(table);
     AddBezierToLinesAdapters(table);
     AddBoundsAdapters(table);
     AddCircleAdapters(table);
@@ -44,6 +45,7 @@ Table MakeTable()
     AddCuttingAdapters(table);
     AddDecompositionAdapters(table);
     AddExtentsAdapters(table);
+    AddFitBezierAdapters(table);
     AddIntersectionAdapters(table);
     AddIntervalVectorAdapters(table);
     AddLayoutAdapters(table);

@@ -66,6 +66,7 @@ Table MakeTable();
 /// @{
 void AddAnglesAdapters(Table& table);
 void AddBatchesAdapters(Table& table);
+void AddBezierOffsetAdapters(Table& table);
 void AddBezierToLinesAdapters(Table& table);
 void AddBoundsAdapters(Table& table);
 void AddCircleAdapters(Table& table);
@@ -76,6 +77,7 @@ void AddCurvatureAdapters(Table& table);
 void AddCuttingAdapters(Table& table);
 void AddDecompositionAdapters(Table& table);
 void AddExtentsAdapters(Table& table);
+void AddFitBezierAdapters(Table& table);
 void AddIntersectionAdapters(Table& table);
 void AddIntervalVectorAdapters(Table& table);
 void AddLayoutAdapters(Table& table);
