@@ -20,8 +20,8 @@ namespace curvelab {
 /// An option of a command that takes one value.
 struct OptionSpec
 {
-    std::string name;        ///< with its dashes
-    std::string placeholder; ///< what the help shows for the value
+    std::string name;      ///< with its dashes
+    std::string valueName; ///< what the help shows for the value
     std::string help;
     std::string fallback; ///< the value when the option is not given; empty if it must be
 };

@@ -59,7 +59,7 @@ void AddOwnOptions(CLI::App& app, const Command& command, Texts& texts)
         std::string& value = texts.arguments[option.name] = option.fallback;
         const std::string help = option.help + (option.fallback.empty() ? "" : " (default " + option.fallback + ")");
         app.add_option(option.name, value, help)
-            ->type_name(option.placeholder)
+            ->type_name(option.valueName)
             ->required(option.fallback.empty())
             ->group("Question");
     }
