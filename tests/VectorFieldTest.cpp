@@ -2,39 +2,11 @@
 
 #include "ZarnMath/Bounds.h"
 #include "tests/DenseRow.h"
+#include "tests/ScarceHeap.h"
 
-#include <cstdlib>
 #include <cstring>
-#include <new>
 #include <random>
 #include <type_traits>
-
-namespace {
-
-/// What the allocations of this thread are held to, and how many there were.
-thread_local std::size_t largestAllocation = std::numeric_limits<std::size_t>::max();
-thread_local std::size_t allocations = 0;
-
-} // namespace
-
-void* operator new(std::size_t size)
-{
-    ++allocations;
-    void* memory = size <= largestAllocation ? std::malloc(size) : nullptr;
-    if (memory == nullptr)
-        throw std::bad_alloc();
-    return memory;
-}
-
-void operator delete(void* memory) noexcept
-{
-    std::free(memory);
-}
-
-void operator delete(void* memory, std::size_t) noexcept
-{
-    std::free(memory);
-}
 
 namespace ZarnMath {
 namespace {
@@ -46,24 +18,6 @@ constexpr std::int32_t smallest = std::numeric_limits<std::int32_t>::min();
 constexpr std::int32_t largest = std::numeric_limits<std::int32_t>::max();
 constexpr float nan = std::numeric_limits<float>::quiet_NaN();
 constexpr float infinity = std::numeric_limits<float>::infinity();
-
-/// Makes larger allocations fail for as long as it lives.
-class Scarcity
-{
-public:
-    explicit Scarcity(std::size_t largestSize)
-    {
-        largestAllocation = largestSize;
-    }
-
-    Scarcity(const Scarcity&) = delete;
-    Scarcity& operator=(const Scarcity&) = delete;
-
-    ~Scarcity()
-    {
-        largestAllocation = std::numeric_limits<std::size_t>::max();
-    }
-};
 
 VectorField FieldOf(int width, int height, int x, int y)
 {
@@ -257,10 +211,10 @@ TEST(VectorField, ClearKeepsBoundsAndStorage)
         EXPECT_EQ(row.start, 0U);
         EXPECT_EQ(row.end, 0U);
     }
-    const std::size_t before = allocations;
+    const std::size_t before = CountAllocations();
     for (int x = 1; x <= 6; ++x)
         field.SetVector(x, 3, {1.0F, 1.0F});
-    EXPECT_EQ(allocations, before);
+    EXPECT_EQ(CountAllocations(), before);
 }
 
 TEST(VectorField, ReboundKeepsWhatOverlapsInPlace)
@@ -707,11 +661,11 @@ TEST(VectorFieldGet, NegativeZeroAndSmallestSteps)
 TEST(VectorFieldGet, AllocatesNothing)
 {
     const VectorField field = FullField(16, 16, 0, 0);
-    const std::size_t before = allocations;
+    const std::size_t before = CountAllocations();
     float sum = 0.0F;
     for (int i = 0; i < 100; ++i)
         sum += field.Get({static_cast<float>(i) * 0.17F, 3.3F}).x;
-    EXPECT_EQ(allocations, before);
+    EXPECT_EQ(CountAllocations(), before);
     EXPECT_GT(sum, 0.0F);
 }
 
