@@ -326,7 +326,7 @@ bool Throws(Generate generate)
         expect(!Throws([] { (void)Random::Generate(0, 10); })); // the next call tries again
         LimitFiles(0);
         expect(!Throws([] { (void)Random::Generate(0.0, 1.0); })); // and from then on needs no device
-        LimitFiles(64); // the sanitizers look into files, too
+        LimitFiles(64);                                            // the sanitizers look into files, too
     }).join();
     std::_Exit(isRight ? 0 : 1);
 }

@@ -78,7 +78,7 @@ TEST(SmallMatrix, NumberIsPreferredToNan)
 {
     auto m = Make<2, 2>({{nan, 1.0}, {4.0, 2.0}});
     EXPECT_FALSE(m.GaussJordenEliminate()); // the rest is NaN
-    EXPECT_EQ(m(0, 0), 1.0); // the second row, scaled
+    EXPECT_EQ(m(0, 0), 1.0);                // the second row, scaled
 }
 
 TEST(SmallMatrix, TopmostOfEqualPivotsIsKept)

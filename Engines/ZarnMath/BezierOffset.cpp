@@ -83,7 +83,7 @@ public:
         }
         const Cubic piece = Stretch(curve, pieceStart, t);
         const bool isValid = IsBezierValidForOffset(piece.points, distance);
-        if (validityChanges && isValid != wasValid && !isFirst)
+        if (validityChanges != nullptr && isValid != wasValid && !isFirst)
             validityChanges->push_back(pieceStart);
         if (isValid)
             Keep(piece, t);
@@ -144,7 +144,7 @@ struct OffsetSamples
     {
         double extremes[mostExtremes];
         const int count = CubicBezier::FindCurvatureMinMax(f.a, f.b, f.c, extremes);
-        const auto capacity = static_cast<std::size_t>(count + gridSteps + 1);
+        const auto capacity = static_cast<std::size_t>(count) + gridSteps + 1;
         parameters.reserve(capacity);
         points.reserve(capacity);
         if (count > 0)

@@ -109,7 +109,7 @@ struct WorstPoint
         if (!(distanceSquared > error))
             return;
         error = distanceSquared;
-        if (parameter)
+        if (parameter != nullptr)
             *parameter = t;
     }
 };
