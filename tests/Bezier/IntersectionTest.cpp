@@ -283,8 +283,9 @@ TEST(StraightIntersection, AcceptsLessThanTwoUnitsFromTheCurve)
 {
     // The bow hangs 0.75*depth below its chord at the middle, and its control points lie depth/2 off their best line.
     const auto bow = [](double depth) { return Cubic{{{0.0, 0.0}, {100.0, -depth}, {200.0, -depth}, {300.0, 0.0}}}; };
-    EXPECT_TRUE(StraightTest(bow(2.66), UprightAt(149.0)).found);
-    const StraightTest far(bow(2.67), UprightAt(149.0));
+    // At x = 149 it hangs 3*depth*(149/300)*(151/300), which is 2 for a depth of 2.666785.
+    EXPECT_TRUE(StraightTest(bow(2.6667), UprightAt(149.0)).found);
+    const StraightTest far(bow(2.6669), UprightAt(149.0));
     EXPECT_FALSE(far.found);
     EXPECT_EQ(far.c, occupied);
     EXPECT_TRUE(StraightTest(bow(2.67), UprightAt(40.0)).found);
