@@ -67,6 +67,10 @@ def scenes(fonts):
     for name, distance in (("nautilus.svg", "-2500"), ("rose-window.svg", "-2500"), ("knots.svg", "2500")):
         yield (f"cusps {name}", "Offset curves, and where they turn back.",
                ["cusps", *drawing(name), "--distance", distance])
+    yield ("offset nautilus.svg", "Cubics fitted to the offset; what would fold is left out.",
+           ["offset", *drawing("nautilus.svg"), "--distance=-2500"])
+    yield ("smooth rose-window.svg", "A coarse grid makes kinks; two cubics with a smooth joint take their place.",
+           ["smooth", *drawing("rose-window.svg"), "--units", "150", "--integer"])
     for font in fonts:
         family = os.path.splitext(os.path.basename(font))[0]
         yield (f"flatten a line of text, {family}", "Outlines of a font; quadratics are raised to cubics.",
@@ -87,6 +91,14 @@ def scenes(fonts):
                ["area", *text("Rag&", font)])
         yield (f"cusps in letters, {family}", "An offset to the left of the outlines, and where it turns back.",
                ["cusps", *text("Rag&", font), "--distance", "900"])
+        yield (f"offset of a letter, {family}", "An outline on both sides, fitted with cubics.",
+               ["offset", *text("&", font), "--distance", "2500", "--sides", "2"])
+        yield (f"fit of letters, {family}", "Points along the outlines, and as few cubics as come near enough.",
+               ["fit", *text("Rg", font), "--tolerance", "60", "--spacing", "800"])
+        yield (f"fit of noisy letters, {family}", "Points beside the outlines; the corners are kept.",
+               ["fit", *text("R&", font), "--tolerance", "500", "--spacing", "600", "--noise", "250", "--reach", "10"])
+        yield (f"smooth letters, {family}", "Rounded to a coarse grid, with the kinks taken out.",
+               ["smooth", *text("g&", font), "--units", "150", "--integer"])
 
 
 def run(curvelab, folder, number, scene):

@@ -56,9 +56,12 @@ struct Command
 [[nodiscard]] Command ClosestCommand();
 [[nodiscard]] Command CurvatureCommand();
 [[nodiscard]] Command CuspsCommand();
+[[nodiscard]] Command FitCommand();
 [[nodiscard]] Command FlattenCommand();
 [[nodiscard]] Command IntersectCommand();
 [[nodiscard]] Command LengthCommand();
+[[nodiscard]] Command OffsetCommand();
+[[nodiscard]] Command SmoothCommand();
 [[nodiscard]] Command SplitCommand();
 [[nodiscard]] Command TangentsCommand();
 [[nodiscard]] Command TransformCommand();
@@ -66,9 +69,9 @@ struct Command
 /// The table, in the order in which the help lists it.
 [[nodiscard]] inline std::vector<Command> Commands()
 {
-    return {FlattenCommand(), SplitCommand(),  ClosestCommand(),   CurvatureCommand(),
-            LengthCommand(),  BoundsCommand(), IntersectCommand(), TangentsCommand(),
-            AreaCommand(),    CuspsCommand(),  TransformCommand()};
+    return {FlattenCommand(),   SplitCommand(),     ClosestCommand(),  CurvatureCommand(), LengthCommand(),
+            BoundsCommand(),    IntersectCommand(), TangentsCommand(), AreaCommand(),      CuspsCommand(),
+            TransformCommand(), OffsetCommand(),    FitCommand(),      SmoothCommand()};
 }
 
 /// Calls f(curve, index) with each curve of a job's drawing in turn, and keeps the progress.

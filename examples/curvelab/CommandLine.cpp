@@ -32,7 +32,9 @@ struct Texts
 void AddCommonOptions(CLI::App& app, Texts& texts)
 {
     CommonOptions& common = texts.common;
-    app.add_option("drawing", common.input, "An SVG file")->type_name("FILE")->group("Drawing");
+    app.add_option("drawing", common.input, "An SVG file, or a list of points named *.txt")
+        ->type_name("FILE")
+        ->group("Drawing");
     app.add_option("--text", common.text, "Take this text as the drawing instead, set in --font")
         ->type_name("TEXT")
         ->group("Drawing");

@@ -2,8 +2,11 @@
 
 #include <algorithm>
 #include <cmath>
+#include <numbers>
 
 namespace curvelab {
+
+using ZarnMath::vector2d;
 
 double Distance(const point2d& p, const point2d& q)
 {
@@ -41,6 +44,88 @@ double AreaOf(const std::vector<point2d>& polygon)
     for (std::size_t i = 2; i < polygon.size(); ++i)
         twice += ZarnMath::Cross(polygon[i] - polygon[0], polygon[i - 1] - polygon[0]);
     return 0.5 * twice;
+}
+
+namespace {
+
+vector2d Unit(const vector2d& v)
+{
+    const double length = std::hypot(v.x, v.y);
+    return length > 0.0 ? v / length : vector2d{0.0, 0.0};
+}
+
+/// The unit vector along a curve. Where the speed vanishes it is that of a short chord.
+vector2d DirectionAt(const PowerForm& p, double t)
+{
+    constexpr double step = 1e-5;
+    const vector2d speed = DerivativeAt(p, t);
+    const vector2d chord = Evaluate(p, std::min(t + step, 1.0)) - Evaluate(p, std::max(t - step, 0.0));
+    return Unit(std::hypot(speed.x, speed.y) * step < 1e-3 * std::hypot(chord.x, chord.y) ? chord : speed);
+}
+
+} // namespace
+
+vector2d StartDirection(const Cubic& curve)
+{
+    for (std::size_t i = 1; i < 4; ++i)
+        if (curve[i] != curve[0])
+            return Unit(curve[i] - curve[0]);
+    return {0.0, 0.0};
+}
+
+vector2d EndDirection(const Cubic& curve)
+{
+    return StartDirection({{curve[3], curve[2], curve[1], curve[0]}}) * -1.0;
+}
+
+double TurnBetween(const Cubic& before, const Cubic& after)
+{
+    const vector2d from = EndDirection(before);
+    const vector2d to = StartDirection(after);
+    return std::fabs(std::atan2(ZarnMath::Cross(from, to), ZarnMath::Dot(from, to))) * 180.0 / std::numbers::pi;
+}
+
+Track::Track(const Cubic& curve, double distance) : p_(ToPowerForm(curve)), distance_(distance), samples_(Stretch(256))
+{}
+
+point2d Track::PointAt(double t) const
+{
+    return Evaluate(p_, t) + ZarnMath::Perpendicular(DirectionAt(p_, t)) * distance_;
+}
+
+std::vector<point2d> Track::Stretch(int chords) const
+{
+    std::vector<point2d> points;
+    for (int i = 0; i <= chords; ++i)
+        points.push_back(PointAt(static_cast<double>(i) / chords));
+    return points;
+}
+
+double Track::Distance(const point2d& q) const
+{
+    const auto nearest = std::min_element(samples_.begin(), samples_.end(), [&](const point2d& a, const point2d& b) {
+        return ZarnMath::LengthSquared(q - a) < ZarnMath::LengthSquared(q - b);
+    });
+    const double step = 1.0 / static_cast<double>(samples_.size() - 1);
+    const double t = static_cast<double>(nearest - samples_.begin()) * step;
+    const double foot = Foot(q, std::max(t - step, 0.0), std::min(t + step, 1.0));
+    return std::min(curvelab::Distance(q, *nearest), curvelab::Distance(q, PointAt(foot)));
+}
+
+/// The normals of the cubic are those of the curve at a distance from it.
+double Track::Foot(const point2d& q, double from, double to) const
+{
+    double t = 0.5 * (from + to);
+    for (int pass = 0; pass < 8; ++pass) {
+        const vector2d away = q - Evaluate(p_, t);
+        const vector2d speed = DerivativeAt(p_, t);
+        const vector2d bend{6.0 * p_.a.x * t + 2.0 * p_.b.x, 6.0 * p_.a.y * t + 2.0 * p_.b.y};
+        const double slope = ZarnMath::Dot(away, bend) - ZarnMath::LengthSquared(speed);
+        if (slope == 0.0)
+            break;
+        t = std::clamp(t - ZarnMath::Dot(away, speed) / slope, from, to);
+    }
+    return t;
 }
 
 double LargerSide(const Bounds& box)

@@ -1,6 +1,7 @@
 #include "CommandLine.h"
 #include "Failure.h"
 #include "Files.h"
+#include "PointsReader.h"
 #include "SvgReader.h"
 #include "TextReader.h"
 
@@ -17,7 +18,9 @@ constexpr int refused = 2;
 
 Drawing Load(const CommonOptions& common)
 {
-    Drawing drawing = common.input.empty() ? ReadText(common.text, common.font) : ReadSvg(common.input);
+    Drawing drawing = common.input.empty()           ? ReadText(common.text, common.font)
+                      : IsListOfPoints(common.input) ? ReadPoints(common.input)
+                                                     : ReadSvg(common.input);
     Fit(drawing, common.units);
     return drawing;
 }

@@ -62,6 +62,8 @@ TEST(Errors, CommandLinesThatMakeNoSense)
         {{"tangents", "drawing.svg"}, {"--to"}},
         {{"length", "drawing.svg"}, {"--spacing"}},
         {{"cusps", "drawing.svg"}, {"--distance"}},
+        {{"offset", "drawing.svg"}, {"--distance"}},
+        {{"fit", "drawing.svg"}, {"--tolerance"}},
         {{"area", "drawing.svg", "--spacing", "5"}, {"--spacing"}},
         {{"flatten", "drawing.svg", "--tolerance"}, {"--tolerance"}},
         {{"split"}, {"no drawing"}},
@@ -101,6 +103,15 @@ TEST(Errors, NumbersThatAreNone)
         {{"cusps", "drawing.svg", "--distance", "nan"}, {"--distance", "\"nan\"", "finite"}},
         {{"cusps", "drawing.svg", "--distance", "far"}, {"--distance", "\"far\"", "not a number"}},
         {{"cusps", "drawing.svg", "--distance", "-1000001"}, {"--distance", "-1e+06", "ten times"}},
+        {{"offset", "drawing.svg", "--distance", "-1000001"}, {"--distance", "-1e+06", "ten times"}},
+        {{"offset", "drawing.svg", "--distance", "1", "--sides", "3"}, {"--sides", "\"3\"", "1 to 2"}},
+        {{"offset", "drawing.svg", "--distance", "1", "--tolerance", "-1"}, {"--tolerance", "\"-1\"", "negative"}},
+        {{"fit", "drawing.svg", "--tolerance", "9", "--spacing", "1"}, {"--spacing", "1", "too small", "100000"}},
+        {{"fit", "drawing.svg", "--tolerance", "9", "--noise", "-1"}, {"--noise", "negative"}},
+        {{"fit", "drawing.svg", "--tolerance", "9", "--seed", "1.5"}, {"--seed", "whole"}},
+        {{"fit", "drawing.svg", "--tolerance", "9", "--corner", "181"}, {"--corner", "\"181\"", "0 to 180"}},
+        {{"fit", "drawing.svg", "--tolerance", "9", "--reach", "0"}, {"--reach", "\"0\""}},
+        {{"smooth", "drawing.svg", "--corner", "-1"}, {"--corner", "\"-1\"", "0 to 180"}},
         {{"split", "drawing.svg", "--units", "0"}, {"--units", "\"0\""}},
         {{"split", "drawing.svg", "--units", "-5"}, {"--units", "\"-5\""}},
         {{"split", "drawing.svg", "--units", "268435457"}, {"--units", "\"268435457\"", "268435456"}},
@@ -118,6 +129,13 @@ TEST(Errors, DrawingsThatAreNone)
     folder.WriteSvg("", "empty.svg");
     folder.WriteSvg("<path d='M5,5 C5,5 5,5 5,5'/>", "point.svg");
     folder.WriteSvg("<path d='M0,0 L1e308,0' transform='scale(1e10)'/>", "huge.svg");
+    folder.Write("three.txt", "1 2\n3 4 5\n");
+    folder.Write("word.txt", "1 2\n\n3 four\n");
+    folder.Write("remarks.txt", "# nothing\n");
+    ExpectRefused({{"split", "missing.txt", "-o", "p.svg"}, {"missing.txt", "No such file"}}, folder);
+    ExpectRefused({{"split", "three.txt", "-o", "p.svg"}, {"three.txt", "line 2", "two numbers"}}, folder);
+    ExpectRefused({{"split", "word.txt", "-o", "p.svg"}, {"word.txt", "line 3", "\"four\""}}, folder);
+    ExpectRefused({{"split", "remarks.txt", "-o", "p.svg"}, {"remarks.txt", "no curves"}}, folder);
     std::filesystem::create_directory(folder.Path() / "folder.svg");
     ExpectRefused({{"split", "missing.svg", "-o", "p.svg"}, {"missing.svg", "No such file"}}, folder);
     ExpectRefused({{"split", "broken.svg", "-o", "p.svg"}, {"broken.svg", "line 4"}}, folder);

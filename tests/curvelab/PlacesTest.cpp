@@ -217,9 +217,16 @@ TEST(Program, DrawsEveryCommand)
 {
     const TemporaryFolder folder;
     const std::string file = folder.WriteSvg(circle);
-    const std::vector<std::vector<std::string>> commands = {
-        {"curvature"}, {"length", "--spacing=700"},   {"bounds"}, {"intersect"}, {"tangents", "--to=-9,-9"},
-        {"area"},      {"cusps", "--distance=-20000"}};
+    const std::vector<std::vector<std::string>> commands = {{"curvature"},
+                                                            {"length", "--spacing=700"},
+                                                            {"bounds"},
+                                                            {"intersect"},
+                                                            {"tangents", "--to=-9,-9"},
+                                                            {"area"},
+                                                            {"cusps", "--distance=-20000"},
+                                                            {"offset", "--distance=900"},
+                                                            {"fit", "--tolerance=90"},
+                                                            {"smooth"}};
     for (std::vector<std::string> command : commands) {
         command.insert(command.begin() + 1, file);
         command.insert(command.end(), {"-o", "picture.svg"});
