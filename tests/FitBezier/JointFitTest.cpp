@@ -373,6 +373,41 @@ TEST(JointFitProperties, IsThePlainIteration)
     EXPECT_GT(rejected, 100);
 }
 
+TEST(JointFitProperties, KnownCubicsAreFoundFromTheirParameters)
+{
+    // The parameters of the halves end 1/16 before the join and begin 1/16 behind it, so that the join is where the driver
+    // puts it, halfway between, and the handles there are equal.
+    RandomSource random(13);
+    for (int n = 0; n < 500; ++n) {
+        Cubic a = RandomArch(random, 100.0);
+        Cubic b = RandomArch(random, 100.0);
+        const vector2d toJoin = a[3] - b[0];
+        for (point2d& p : b)
+            p = p + toJoin;
+        b[1] = b[0] + (a[3] - a[2]);
+        std::vector<point2d> points;
+        std::vector<double> u;
+        for (const double v : RandomParameters(random, 12)) {
+            points.push_back(BernsteinPoint(a.data(), v * 0.9375));
+            u.push_back(v * 0.9375 * 0.5);
+        }
+        for (const double v : RandomParameters(random, 12)) {
+            points.push_back(BernsteinPoint(b.data(), 0.0625 + v * 0.9375));
+            u.push_back(0.5 + (0.0625 + v * 0.9375) * 0.5);
+        }
+        Bezier first;
+        Bezier second;
+        LeastSquares(points.data(), u.data(), 24, 12, a[1] - a[0], b[3] - b[2], first.data(), second.data(), 1);
+        for (int i = 0; i < 4; ++i) {
+            const auto k = static_cast<std::size_t>(i);
+            EXPECT_NEAR(first[i].x, a[k].x, 1e-7) << n;
+            EXPECT_NEAR(first[i].y, a[k].y, 1e-7) << n;
+            EXPECT_NEAR(second[i].x, b[k].x, 1e-7) << n;
+            EXPECT_NEAR(second[i].y, b[k].y, 1e-7) << n;
+        }
+    }
+}
+
 TEST(JointFitProperties, MorePassesAreNeverWorse)
 {
     RandomSource random(12);

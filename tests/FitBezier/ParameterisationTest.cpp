@@ -1,5 +1,6 @@
 #include "ZarnMath/Bounds.h"
 #include "ZarnMath/FitBezierInternal.h"
+#include "ZarnMath/RootFinder.h"
 
 #include "tests/FitBezier/Runs.h"
 #include "tests/Sentinels.h"
@@ -217,6 +218,32 @@ TEST(ReparameterizeU, NewtonIsTrustedForShortMovesOnly)
     }
 }
 
+/// A point a little below the centre of the arch's osculating circle at its summit, (150, 175), and to the left of the
+/// axis: with s = t - 1/2 its distance is stationary where 54000*s^3 - 5.4*s + 0.001 = 0. The root near s = -0.01 is the
+/// nearest, that near 0.01 is hardly farther, and that between them is the farthest.
+constexpr point2d belowTheCentre{150.0 - 1e-4, 175.0 - 0.09};
+
+TEST(ReparameterizeU, NewtonEndsAtAStepThatDoesNotShrink)
+{
+    const double left = StationaryParameter(belowTheCentre, 0.47, 0.4942);
+    const double right = StationaryParameter(belowTheCentre, 0.5058, 0.53);
+    // From here the steps shrink, and the right root is as good as any.
+    EXPECT_NEAR(Moved(arch, belowTheCentre, 0.515).u, right, 1e-7);
+    // From here they are 0.0099 to the left and 0.026 to the right. They would go on to the right root, which is near enough
+    // to the start to be trusted; but the search has the say, and takes the left one.
+    EXPECT_NEAR(Moved(arch, belowTheCentre, 0.5046).u, left, 1e-7);
+}
+
+TEST(ReparameterizeU, FirstStepIsBelowOne)
+{
+    // Where the slope 162000*s^2 - 5.4 all but vanishes the first step leads far out to the right, 0.95 and 1.05 from these
+    // two places. From there Newton's method would come back to the right root.
+    const double left = StationaryParameter(belowTheCentre, 0.47, 0.4942);
+    const double right = StationaryParameter(belowTheCentre, 0.5058, 0.53);
+    EXPECT_NEAR(Moved(arch, belowTheCentre, 0.50578464).u, right, 1e-7);
+    EXPECT_NEAR(Moved(arch, belowTheCentre, 0.50578358).u, left, 1e-7);
+}
+
 TEST(ReparameterizeU, SearchFindsTheNearestRoot)
 {
     const point2d p{160.0, 100.0};
@@ -227,6 +254,34 @@ TEST(ReparameterizeU, SearchFindsTheNearestRoot)
         EXPECT_EQ(moved.worst_u, moved.u);
         EXPECT_NEAR(moved.error, LengthSquared(p - BernsteinPoint(arch.data(), right)), 1e-6);
     }
+}
+
+TEST(ReparameterizeU, FirstOfEqualDistancesStands)
+{
+    // Points on the axis of the arch, below the centre of its curvature: as near to the left arm as to the right one, but
+    // for rounding. Only those to which they are equal to the last bit count here.
+    const CubicBezier::PowerForm f = CubicBezier::ToPowerForm(arch.data());
+    int ties = 0;
+    for (int y = -600; y < 175; ++y) {
+        const point2d p{150.0, static_cast<double>(y)};
+        const vector2d q = f.d - p;
+        const double c[6] = {3.0 * Dot(f.a, f.a),
+                             5.0 * Dot(f.b, f.a),
+                             4.0 * Dot(f.c, f.a) + 2.0 * Dot(f.b, f.b),
+                             3.0 * (Dot(f.b, f.c) + Dot(q, f.a)),
+                             Dot(f.c, f.c) + 2.0 * Dot(q, f.b),
+                             Dot(q, f.c)};
+        double roots[6];
+        const int count = RootFinder::FindRoots<5>(c, roots, false);
+        const auto distance = [&](double t) { return LengthSquared(CubicBezier::Evaluate(f, t) - p); };
+        if (count < 2 || distance(roots[0]) != distance(roots[count - 1]))
+            continue;
+        ++ties;
+        EXPECT_LT(roots[0], 0.5);
+        EXPECT_GT(roots[count - 1], 0.5);
+        EXPECT_EQ(Moved(arch, p, nan).u, roots[0]) << y;
+    }
+    EXPECT_GT(ties, 20);
 }
 
 TEST(ReparameterizeU, PointCurveMovesNothing)
