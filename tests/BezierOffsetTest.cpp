@@ -214,13 +214,14 @@ TEST(GetSegmentsToOffset, CuspBeforeTheCurveIsPassedOver)
 {
     // At such a distance all cusps are as good as at the inflections, which are double roots; the root finder's test for
     // these finds the one of the curve's extension backwards.
-    const Segment s = {{{-3.0, 7.0}, {6.0, 8.0}, {-7.0, 6.0}, {4.0, -1.0}}};
+    const Segment s = {{{-0.3, 0.7}, {0.6, 0.8}, {-0.7, 0.6}, {0.4, -0.1}}};
     const PowerForm f = ToPowerForm(s.points);
     std::vector<double> cusps;
-    ASSERT_TRUE(CubicBezier::FindOffsetCusps(f.a, f.b, f.c, 1e12, cusps));
+    ASSERT_TRUE(CubicBezier::FindOffsetCusps(f.a, f.b, f.c, 1e10, cusps));
     ASSERT_EQ(cusps.size(), 1U);
     ASSERT_NEAR(cusps[0], -0.0658, 1e-4);
-    const Stretches stretches = Split(s, 1e12);
+    ASSERT_NE(Part(s, cusps[0], 1.0), s); // it would be cut, and rounded
+    const Stretches stretches = Split(s, 1e10);
     ASSERT_EQ(stretches.segments.size(), 1U);
     EXPECT_TRUE(SameBits(stretches.segments[0].points, s.points, 4));
     EXPECT_TRUE(stretches.validityChanges.empty());

@@ -220,6 +220,10 @@ void FitPoints(std::span<const point2d> points, const vector2d& start, const vec
 
 void FitRun(const Run& run, const Settings& settings, Totals& totals)
 {
+    const bool isPoint =
+        std::all_of(run.points.begin(), run.points.end(), [&](const point2d& p) { return p == run.points[0]; });
+    if (isPoint)
+        return;
     if (run.isLoop) {
         const vector2d direction = DirectionOfLoop(run.points, settings.reach);
         FitPoints(run.points, direction, direction, settings, totals);
@@ -252,6 +256,9 @@ Totals Find(const Settings& settings, const Job& job)
         Contour contour = original;
         for (Cubic& curve : contour.curves)
             curve = Asked(job, curve);
+        std::erase_if(contour.curves, IsPoint);
+        if (contour.curves.empty())
+            continue;
         const PointChain chain = ToPoints(contour, settings, noise);
         totals.points += static_cast<std::int64_t>(chain.points.size());
         totals.corners += std::count(chain.isCorner.begin(), chain.isCorner.end(), true);

@@ -65,6 +65,11 @@ vector2d DirectionAt(const PowerForm& p, double t)
 
 } // namespace
 
+bool IsPoint(const Cubic& curve)
+{
+    return curve[0] == curve[1] && curve[0] == curve[2] && curve[0] == curve[3];
+}
+
 vector2d StartDirection(const Cubic& curve)
 {
     for (std::size_t i = 1; i < 4; ++i)
@@ -85,7 +90,7 @@ double TurnBetween(const Cubic& before, const Cubic& after)
     return std::fabs(std::atan2(ZarnMath::Cross(from, to), ZarnMath::Dot(from, to))) * 180.0 / std::numbers::pi;
 }
 
-Track::Track(const Cubic& curve, double distance) : p_(ToPowerForm(curve)), distance_(distance), samples_(Stretch(256))
+Track::Track(const Cubic& curve, double distance) : p_(ToPowerForm(curve)), distance_(distance), samples_(Stretch(128))
 {}
 
 point2d Track::PointAt(double t) const

@@ -30,6 +30,9 @@ inline constexpr int fineChords = 4096;
 /// @param polygon its corners, the first one not repeated, or repeated
 [[nodiscard]] double AreaOf(const std::vector<point2d>& polygon);
 
+/// Whether all control points are one.
+[[nodiscard]] bool IsPoint(const Cubic& curve);
+
 /// The unit vector along a curve's start, from its first control point that lies elsewhere; (0, 0) for a point.
 [[nodiscard]] ZarnMath::vector2d StartDirection(const Cubic& curve);
 
@@ -53,7 +56,7 @@ public:
     /// The points at equal steps of the parameter, one more than there are chords.
     [[nodiscard]] std::vector<point2d> Stretch(int chords) const;
 
-    /// How far a point is away: from the nearest of 256 samples, and on by Newton's method to the foot of the normal.
+    /// How far a point is away: from the nearest of 128 samples, and on by Newton's method to the foot of the normal.
     [[nodiscard]] double Distance(const point2d& q) const;
 
 private:

@@ -56,11 +56,6 @@ struct Totals
     std::int64_t points = 0; ///< curves of no extent: they have no offset
 };
 
-bool IsPoint(const Cubic& curve)
-{
-    return curve[0] == curve[1] && curve[0] == curve[2] && curve[0] == curve[3];
-}
-
 /// Fits, and cuts what is not near enough where the library says.
 void FitPiece(const Cubic& source, double distance, double tolerance, int cuts, std::vector<Fit>& fits)
 {
@@ -95,7 +90,7 @@ void AddSide(const Cubic& curve, double distance, double tolerance, Totals& tota
 void Measure(const Fit& fit, Deviation& worst)
 {
     const Track exact(fit.source, fit.distance);
-    for (const point2d& q : Sampled(fit.offset, 128))
+    for (const point2d& q : Sampled(fit.offset, 64))
         if (const double distance = exact.Distance(q); distance > worst.distance)
             worst = {distance, q, fit};
 }
@@ -250,7 +245,7 @@ Command OffsetCommand()
             "Each curve is cut into the stretches whose offset does not fold, and each stretch is fitted with one\n"
             "cubic; one that is not within the tolerance is cut in two where the library says, up to six times. The\n"
             "library judges by a dozen samples. The largest deviation is measured without it: along the normals of\n"
-            "the exact offset, from 129 points of each fitted cubic. A positive distance goes to the left, seen along\n"
+            "the exact offset, from 65 points of each fitted cubic. A positive distance goes to the left, seen along\n"
             "the curve. Each curve is offset for itself: at the corners of a contour the offsets neither meet nor are\n"
             "cut. There is no integer overload: --integer asks about the rounded control points in double.",
             {{"--distance", "D", "Distance of the offset, in drawing units; at most ten times the larger side", ""},

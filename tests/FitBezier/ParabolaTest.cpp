@@ -59,6 +59,25 @@ TEST(ParabolaFit, ZeroHasNoSign)
         EXPECT_TRUE(SameBits(value, 0.0));
 }
 
+TEST(ParabolaFitProperties, ZeroHasNoSignWhereProductsUnderflow)
+{
+    RandomSource random(3);
+    int zeros = 0;
+    for (int n = 0; n < 2000; ++n) {
+        std::vector<point2d> points(3);
+        for (point2d& p : points)
+            p = {random.Uniform(-1e12, 1e12), random.Uniform(-1e-318, 1e-318)};
+        std::vector<double> c;
+        ASSERT_TRUE(Fit(points, c));
+        for (const double value : c)
+            if (value == 0.0) {
+                ++zeros;
+                EXPECT_FALSE(std::signbit(value)) << n;
+            }
+    }
+    EXPECT_GT(zeros, 1000);
+}
+
 TEST(ParabolaFitProperties, NoOtherParabolaHasSmallerSquares)
 {
     RandomSource random(1);

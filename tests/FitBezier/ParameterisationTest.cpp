@@ -242,6 +242,7 @@ TEST(ReparameterizeU, FirstStepIsBelowOne)
     const double right = StationaryParameter(belowTheCentre, 0.5058, 0.53);
     EXPECT_NEAR(Moved(arch, belowTheCentre, 0.50578464).u, right, 1e-7);
     EXPECT_NEAR(Moved(arch, belowTheCentre, 0.50578358).u, left, 1e-7);
+    EXPECT_NEAR(Moved(arch, belowTheCentre, 0.50578406949375843).u, left, 1e-7); // here it is 1 to the last bit
 }
 
 TEST(ReparameterizeU, SearchFindsTheNearestRoot)

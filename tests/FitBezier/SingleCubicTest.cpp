@@ -227,6 +227,24 @@ TEST(FreePass, EndsAreFittedLikeOtherPoints)
     EXPECT_LT(bezier[0].y, 10.0);
 }
 
+TEST(FreePass, ZeroHasNoSign)
+{
+    // The moments of x are the smallest numbers there are, of the sign that each product with the inverse's row for P(0)
+    // underflows to a negative zero.
+    constexpr double smallest = std::numeric_limits<double>::denorm_min();
+    std::vector<point2d> points(1001, point2d{0.0, 1.0});
+    std::vector<double> u;
+    for (int i = 0; i <= 1000; ++i)
+        u.push_back(i / 1000.0);
+    points[990].x = smallest;                  // counts in all of them
+    points[750].x = points[751].x = -smallest; // not in the cubic one
+    points[700].x = points[701].x = smallest;  // not in the quadratic one either
+    points[300].x = points[301].x = -smallest; // in the plain sum alone
+    Bezier bezier;
+    ASSERT_TRUE(LeastSquaresSingleIteration(points.data(), u.data(), 1001, bezier.data()));
+    EXPECT_TRUE(SameBits(bezier[0].x, 0.0));
+}
+
 TEST(FreePassProperties, NoOtherCurveHasSmallerSquares)
 {
     RandomSource random(2);
@@ -351,6 +369,11 @@ TEST(TangentFit, ThreePointsMeasureAYardstickFirst)
     EXPECT_EQ(LeastSquares(points, u, 3, along, along, bezier.data(), 0, &worst_u, -1.0), 100.0);
     EXPECT_NEAR(u[1], 0.4, 1e-9); // measuring has moved the parameter
     EXPECT_EQ(worst_u, u[1]);
+    double others[3] = {2.0, 3.5, 5.0}; // normalised before they are measured
+    EXPECT_EQ(LeastSquares(points, others, 3, along, along, bezier.data(), 0, &worst_u, -1.0), 100.0);
+    EXPECT_EQ(others[0], 0.0);
+    EXPECT_NEAR(others[1], 0.4, 1e-9);
+    EXPECT_EQ(others[2], 1.0);
 }
 
 TEST(TangentFit, NoPassGivesTheLargestError)

@@ -108,9 +108,9 @@ TEST(Offset, IsCutUntilItIsNear)
         // The library judges by samples; between them the fit may be somewhat farther.
         EXPECT_LT(answer.Number("/answer/largestDeviation"), 1.5 * tolerance);
     }
-    const Numbers never = AskCurvelab(circle, {"offset", "--distance=30000", "--tolerance=0"});
-    EXPECT_EQ(never.Number("/answer/cubics"), 4 * 64);
-    EXPECT_EQ(never.Number("/answer/notNear"), 4 * 64);
+    const Numbers never = AskCurvelab(arch, {"offset", "--distance=30000", "--tolerance=0"});
+    EXPECT_EQ(never.Number("/answer/cubics"), 64);
+    EXPECT_EQ(never.Number("/answer/notNear"), 64);
 }
 
 TEST(Offset, LosesItsFold)
@@ -219,6 +219,18 @@ TEST(Fit, ReadsPoints)
     EXPECT_EQ(answer.Number("/answer/points"), 21 + 3);
     EXPECT_EQ(answer.Number("/answer/cubics"), 1 + 3);
     EXPECT_LT(answer.Number("/answer/largestDeviation"), 0.5);
+}
+
+TEST(Fit, PassesOverPoints)
+{
+    const Numbers answer =
+        AskCurvelab("<path d='M0,0 C0,0 0,0 0,0 L100,0 M50,50 C50,50 50,50 50,50'/>", {"fit", "--tolerance=10"});
+    EXPECT_EQ(answer.Number("/answer/cubics"), 1);
+    EXPECT_EQ(answer.Number("/answer/corners"), 2);
+    // All ends of these loops are one point.
+    const Numbers loops = AskCurvelab("<path d='M0,0 C90,90 -90,90 0,0 C90,90 -90,90 0,0 C90,90 -90,90 0,0'/>",
+                                      {"fit", "--tolerance=10", "--spacing=0", "--corner=180"});
+    EXPECT_EQ(loops.Number("/answer/cubics"), 0);
 }
 
 TEST(Smooth, TakesOutAKink)
