@@ -482,6 +482,28 @@ TEST(FindBezierOffsetCurve, FlatExtremesAreNoSamples)
     EXPECT_EQ(SamplesOf(flat, 5.0).parameters.size(), 11U);
 }
 
+TEST(FindBezierOffsetCurve, ExtremeThatBendsJustEnoughIsASample)
+{
+    // At its extreme the curvature is a tenth of 1/300, the size being 300, to the last bit.
+    const Segment bent = {{{0.0, 0.0}, {70.0, 6.9171473050497703}, {240.0, 6.9171473050497703}, {300.0, 0.0}}};
+    const PowerForm f = ToPowerForm(bent.points);
+    double extremes[11];
+    ASSERT_EQ(CubicBezier::FindCurvatureMinMax(f.a, f.b, f.c, extremes), 1);
+    double curvature = 0.0;
+    ASSERT_TRUE(CubicBezier::GetCurvatureAt(extremes[0], f.a, f.b, f.c, curvature));
+    ASSERT_EQ(std::fabs(curvature), 0.1 / 300.0);
+    const Samples s = SamplesOf(bent, 5.0);
+    ASSERT_EQ(s.parameters.size(), 12U);
+    Bezier expected;
+    Bezier offset;
+    double error = 0.0;
+    double splitParameter = 0.0;
+    FindBezierOffsetUsingLeastSquares(f.a, f.b, f.c, f.d, expected.data(), nan, s.points.data(), 12, error,
+                                      splitParameter);
+    FindBezierOffsetCurve(bent.points, offset.data(), 5.0, 1.0, splitParameter);
+    EXPECT_TRUE(SameBits(offset.data(), expected.data(), 4));
+}
+
 TEST(FindBezierOffsetCurveProperties, FitsTheSamples)
 {
     RandomSource random(2);
