@@ -1,5 +1,5 @@
 # The two Debian packages that CPack makes of the components: libzarnmath<interface version> holds what a program needs to
-# run, libzarnmath-dev what its compilation needs. Configure with the prefix /usr for them, as the preset `package` does.
+# run, libzarnmath-dev what its compilation needs. Configure with the prefix /usr for them, as the preset `deb` does.
 #
 # CPack brings the list of files, the checksums and the dependencies. What else a package has to have stands here.
 set(runtime_package libzarnmath${zarnmath_interface_version})
