@@ -24,8 +24,18 @@ USUAL_FONTS = [
 ]
 
 SMALL_EXAMPLES = [
-    ("warp", "A sparse field of displacements bends a grid of lines."),
+    ("nearest", "From many places to the nearest point of a curve; in orange where that is an end."),
+    ("spacing", "Marks at equal distances along a curve, and at equal steps of its parameter."),
+    ("flatten", "One curve as polylines within four tolerances."),
+    ("extents", "The tight box of a curve within that of its control points."),
+    ("crossings", "Two cubics that cross in nine points."),
+    ("offset", "Lines beside a curve, fitted to its offsets."),
+    ("fit", "A cubic that approaches the points it is fitted to, pass by pass."),
+    ("integers", "A curve in whole units, rounded once or halved again and again."),
+    ("decomposition", "The steps that a matrix is made of."),
+    ("ellipse", "What a matrix makes of a circle."),
     ("spline", "A closed curve through points by the cyclic solver, and beside it how much it bends."),
+    ("warp", "A sparse field of displacements bends a grid of lines."),
     ("layout", "A page laid out by descriptions, with one ornament carried into each part."),
     ("cube", "A cube turned along the arc between two quaternions, in perspective."),
 ]

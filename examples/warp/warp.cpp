@@ -17,12 +17,11 @@ VectorField Stamp(int radius, Displace displace)
     VectorField stamp;
     stamp.Initialize({-radius, radius, radius, -radius});
     for (int y = -radius; y <= radius; ++y)
-        for (int x = -radius; x <= radius; ++x) {
-            const double fade = 1.0 - static_cast<double>(x * x + y * y) / (radius * radius);
-            const vector2d v = displace(vector2d{double(x), double(y)}, fade * fade);
-            if (fade > 0.0)
+        for (int x = -radius; x <= radius; ++x)
+            if (const double fade = 1.0 - static_cast<double>(x * x + y * y) / (radius * radius); fade > 0.0) {
+                const vector2d v = displace(vector2d{double(x), double(y)}, fade * fade);
                 stamp.SetVector(x, y, {static_cast<float>(v.x), static_cast<float>(v.y)});
-        }
+            }
     return stamp;
 }
 
