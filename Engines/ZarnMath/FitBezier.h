@@ -154,9 +154,9 @@ ZARNMATH_API double LeastSquares(const point2d* points, int n, int split, const 
 
 /// Fits the parabola y = c0 + c1*x + c2*x^2 to points, by the squares of the vertical distances.
 ///
-/// @param points               the points, in any order
+/// @param points               the points, in drawing units and in any order
 /// @param count                their number
-/// @param[in,out] coefficients c0, c1 and c2 are appended
+/// @param[in,out] coefficients c0, c1 and c2 are appended, in this order
 /// @return false, with nothing appended, for fewer than three points, and where the normal equations come out as exactly
 ///         singular, as for fewer than three different x
 ZARNMATH_API bool LeastSquares(const point2d* points, unsigned long count, std::vector<double>& coefficients);

@@ -15,7 +15,7 @@ namespace ZarnMath {
 ///
 /// @param x     where
 /// @param mean  the mean
-/// @param sigma the standard deviation; its sign does not count
+/// @param sigma the standard deviation; its sign does not count, and 0 gives NaN
 /// @return the density at x
 [[nodiscard]] ZARNMATH_API double Gaussian(double x, double mean, double sigma) noexcept;
 
@@ -71,7 +71,7 @@ namespace ZarnMath {
 /// @param x    the ramp, 0 to 1
 /// @param gain for `Gain`, which comes second
 /// @param bias for `Bias`, which comes first
-/// @return Gain(Bias(x, bias), gain)
+/// @return Gain(Bias(x, bias), gain), NaN where either gives it
 [[nodiscard]] ZARNMATH_API double GetBiasGainBlendFactor(double x, double gain, double bias) noexcept;
 
 /// @}
