@@ -28,7 +28,7 @@ from pathlib import Path
 # What counts as saying something. The words are those of the headers; a docstring that says it otherwise is reworded.
 CLEARED = re.compile(r"\b(cleared|append|appended|resized|replace|replaced|left alone|never cleared)\b")
 ORDER = re.compile(r"\b(order|ascending|sorted|each point|each of|element for element)\b")
-MOST = re.compile(r"\b(at most|no more|resized to|c0, c1 and c2|a row each|one each|one for each)\b")
+MOST = re.compile(r"\b(at most|no more than|resized to|c0, c1 and c2)\b")
 ELEMENTS = re.compile(
     r"\b(one|two|three|four|five|seven|ten|11|N|n \+ 1|lines \+ 1|each|number|count|the points)\b")
 ON_FALSE = re.compile(
@@ -37,8 +37,7 @@ ON_FALSE = re.compile(
 RANGE = re.compile(
     r"[\[(]0(\.0)?, 1(\.0)?[\])]|\b(0(\.0)? to 1(\.0)?|outside|beyond|extrapolat\w+|extended|t <= 0|at least 1)\b")
 UNIT = re.compile(
-    r"\b(units?|radians?|degrees?|millionths?|squared|parameters?|pi|tangents?|fraction|turn|ratio|reciprocal|"
-    r"drawing)\b|2\*pi|\b360|\b180")
+    r"\b(units?|radians?|degrees?|millionths?|ratios?|squared?|fraction|number of segments)\b|2\*pi|\b360|\b180")
 DEGENERATE = re.compile(
     r"\b(NaN|null|infinite|infinity|infinities|not finite|zero|zeros|vanish\w*|empty|coincide\w*|singular|parallel|cusp|"
     r"degenerate|collapsed|inside out|straight|a point|two points|without|none|nothing|untouched|unchanged|whatever|any|"
@@ -148,7 +147,9 @@ def functions(folder):
 
 def name_of(line):
     """The qualified name in a line of the list, which may be a whole signature, with the result of a template."""
-    return re.sub(r"[<(].*", "", line.strip()).split()[-1]
+    call = "operator()"
+    rest = line.strip().replace(call, "\0")
+    return re.sub(r"[<(].*", "", rest).split()[-1].replace("\0", call)
 
 
 def main(folder, list_of_names):

@@ -241,9 +241,9 @@ ZARNMATH_API int FindCurvatureMinMax(const point2d& a, const point2d& b, const p
 
 /// @}
 /// @name Length
-/// Arc length, in drawing units, by one pass of Gauss-Legendre quadrature of the speed, without control of the error. The nodes and weights
-/// are kept short, most of them at eight decimal places: at orders 5, 6 and 10 a straight unit segment is off by 1e-08
-/// already. A curve with a sharp turn between samples is off by far more.
+/// Arc length, in drawing units, by one pass of Gauss-Legendre quadrature of the speed, without control of the error. The
+/// nodes and weights are kept short, most of them at eight decimal places: at orders 5, 6 and 10 a straight unit segment
+/// is off by 1e-08 already. A curve with a sharp turn between samples is off by far more.
 ///
 /// The squared speed is evaluated as a quartic: where it all but vanishes, rounding can take it below zero, and the length
 /// is then NaN.
@@ -626,7 +626,7 @@ ZARNMATH_API void GetParallels(const point2d& a, const point2d& b, const point2d
 /// The parameters in (0, 1) at which the offset of a cubic has a cusp.
 ///
 /// @param a, b, c         power form
-/// @param distance        positive to the left of the direction of travel; 0 has no cusps
+/// @param distance        in drawing units, positive to the left of the direction of travel; 0 has no cusps
 /// @param[out] parameters cleared, then filled in the root finder's order, with at most 12 values
 /// @return whether there is any. A double root, where the radius only touches the distance, may be listed once, twice or
 ///         not at all, and so may a zero of the speed, which counts for positive distances

@@ -48,8 +48,8 @@ namespace ZarnMath {
 ///
 /// @param x    the ramp, 0 to 1; outside, the same formula
 /// @param gain taken into -1 to 1; 1 flattens the middle into 0.5 at either side, -1 steepens it into a step
-/// @return the bent value. Where the denominator of the lower half vanishes the result is 1, as at x = 0 with gain 1.
-///         At x = 1 with gain 1 it is NaN
+/// @return the bent value. Where the denominator of the lower half vanishes the result is 1: at x = 0 with gain 1, and at
+///         one x above the middle too with every gain below -1/3, as at x = 2/3 with -0.6. At x = 1 with gain 1 it is NaN
 [[nodiscard]] ZARNMATH_API double Gain(double x, double gain) noexcept;
 
 /// How far a step is on the way.

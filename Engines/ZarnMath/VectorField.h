@@ -104,8 +104,8 @@ struct VectorField
     /// @return whether it fitted whole; true for a source without columns
     ZARNMATH_API bool Blit(const VectorField& source, int dx, int dy);
 
-    /// Grows the bounds as by `Extend` to hold the moved source, and copies it in. An empty source leaves bounds of two cells
-    /// or more each way as they are, and turns narrower ones into the empty field.
+    /// Grows the bounds as by `Extend` to hold the moved source, and copies it in. An empty source leaves bounds of two
+    /// cells or more each way as they are, and turns narrower ones into the empty field.
     ///
     /// @param source the field to copy
     /// @param dx, dy the offset

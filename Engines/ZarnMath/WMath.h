@@ -273,7 +273,8 @@ namespace Radians {
 /// The angle from 0 to 2*pi. A tiny negative one gives 2*pi itself, and a -0.0 stays (arithmetic).
 [[nodiscard]] ZARNMATH_API double NormalizeAngle(double angle) noexcept;
 
-/// The angle from -pi to pi, both included: what lies there already is returned as it is, and so is NaN (arithmetic).
+/// The angle in radians from -pi to pi, both included: what lies there already is returned as it is, and so is NaN
+/// (arithmetic).
 [[nodiscard]] ZARNMATH_API double NormalizeFineAngle(double angle) noexcept;
 
 /// (cos, sin) of the angle in radians, times a length; NaN for an infinite angle (platform).
@@ -288,11 +289,11 @@ namespace Radians {
 /// @return the turn; 0 where either vector is zero, holds NaN, or the product of their squared lengths underflows
 [[nodiscard]] ZARNMATH_API double GetAngle(const vector2d& a, const vector2d& b) noexcept;
 
-/// The turn from a to b as seen from the vertex: 0 where either of them is the vertex (platform).
+/// The turn from a to b as seen from the vertex, from 0 to 2*pi; 0 where either of them is the vertex (platform).
 [[nodiscard]] ZARNMATH_API double GetAngle(const point2d& vertex, const point2d& a, const point2d& b) noexcept;
 
-/// `GetAngle` from a to b, folded to above -pi up to pi: opposite vectors give pi whichever way they are turned, and 0
-/// comes out where `GetAngle` gives it (platform).
+/// `GetAngle` from a to b in radians, folded to above -pi up to pi: opposite vectors give pi whichever way they are
+/// turned, and 0 comes out where `GetAngle` gives it (platform).
 [[nodiscard]] ZARNMATH_API double GetFineAngle(const vector2d& a, const vector2d& b) noexcept;
 
 /// The point p turned by an angle in radians about a centre, by way of its difference from the centre. The centre

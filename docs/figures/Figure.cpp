@@ -9,7 +9,7 @@ namespace ZarnMath::Figures {
 namespace {
 
 constexpr const char* style = R"(<style>
-svg { --paper: #fbfaf7; --ink: #22262b; --faint: #8b8880; --curve: #1f5c94; --other: #a85a10; --answer: #b3262d }
+svg { color-scheme: light dark; --paper: #fbfaf7; --ink: #22262b; --faint: #8b8880; --curve: #1f5c94; --other: #a85a10; --answer: #b3262d }
 @media (prefers-color-scheme: dark) {
 svg { --paper: #1b1f24; --ink: #e8e6e1; --faint: #8d9299; --curve: #7fb8ec; --other: #eaa95e; --answer: #ff8a80 } }
 .paper { fill: var(--paper) }
@@ -59,7 +59,7 @@ Figure::Figure(const std::string& path, const BoundsT<double>& view, double widt
     toScreen = ConstructRectTransformMatrix(view, {0.0, 0.0, width, height}, MapStretch);
     out << "<svg xmlns='http://www.w3.org/2000/svg' width='" << Number(width) << "' height='" << Number(height)
         << "' viewBox='0 0 " << Number(width) << ' ' << Number(height) << "'>\n"
-        << style << "<rect class='paper' width='100%' height='100%' rx='6'/>\n";
+        << style << "<rect class='paper' width='100%' height='100%'/>\n";
 }
 
 Figure::~Figure()

@@ -65,15 +65,15 @@ void CurvatureSign(const std::string& path)
 void Sides(const std::string& path)
 {
     Figure figure(path, {-40.0, 170.0, 360.0, -60.0});
-    //! [side]
     const Cubic curve = {{{0, 0}, {90, 120}, {210, -60}, {320, 60}}};
     const PowerForm f = ToPowerForm(curve);
-    const auto isLeft = [&f](const point2d& q) { return CubicBezier::GetSide(f.a, f.b, f.c, f.d, q) == SidePositive; };
-    //! [side]
     for (const double distance : {-34.0, -17.0, 17.0, 34.0}) {
         for (const double t : {0.15, 0.3, 0.45, 0.6, 0.75, 0.9}) {
             const point2d q = CubicBezier::MapToBezier(curve.points, t, distance, 1.0);
-            figure.Dot(q, isLeft(q) ? "answer" : "other");
+            //! [side]
+            const Side side = CubicBezier::GetSide(f.a, f.b, f.c, f.d, q);
+            figure.Dot(q, side == SidePositive ? "answer" : "other");
+            //! [side]
         }
     }
     figure.Curve(curve, "curve");
