@@ -66,7 +66,8 @@ namespace ZarnMath::CubicBezier {
 ZARNMATH_API void Split(double t, const point2d* in, point2d* left, point2d* right) noexcept;
 ZARNMATH_API void Split(double t, const POINT* in, POINT* left, POINT* right) noexcept;
 
-/// Cuts at one half, by midpoints (p + q)*0.5, which can differ in the last bit from the cut at t = 0.5.
+/// Cuts at one half, by midpoints (p + q)*0.5, which can differ in the last bit from the cut at t = 0.5. A curve of any
+/// shape is cut: the halves of a point are that point.
 ///
 /// @param in         four control points
 /// @param[out] left  four control points of the first half
@@ -84,7 +85,7 @@ ZARNMATH_API void Split(const POINT* in, POINT* left, POINT* right) noexcept;
 
 /// Cuts at t into one run of points.
 ///
-/// @param t        parameter of the cut
+/// @param t        parameter of the cut; outside [0, 1] the pieces describe the extended polynomial
 /// @param in       four control points
 /// @param[out] out seven points: the left piece in elements 0 to 3, the right piece in 3 to 6
 ZARNMATH_API void Split(double t, const point2d* in, point2d* out) noexcept;
@@ -96,7 +97,8 @@ ZARNMATH_API void Split(double t, const POINT* in, POINT* out) noexcept;
 /// that element 3 is the start of the middle piece and element 6 the start of the last one. t0 <= 0 and t1 >= 1 take
 /// their special meaning for the middle piece only.
 ///
-/// @param t0, t1   parameters of the cuts, t0 <= t1 for pieces that follow each other
+/// @param t0, t1   parameters of the cuts, t0 <= t1 for pieces that follow each other; outside [0, 1] the first and the
+///                 last piece describe the extended polynomial
 /// @param in       four control points
 /// @param[out] out ten points: the pieces in elements 0 to 3, 3 to 6 and 6 to 9
 ZARNMATH_API void Split(double t0, double t1, const point2d* in, point2d* out) noexcept;
@@ -104,7 +106,8 @@ ZARNMATH_API void Split(double t0, double t1, const POINT* in, POINT* out) noexc
 
 /// The piece from 0 to t, bit for bit the left piece of `Split`.
 ///
-/// @param t        parameter of the cut
+/// @param t        parameter of the cut; beyond 1 the piece goes on along the extended polynomial, below 0 it runs
+///                 backward from P0, and at 0 it is the point P0 four times
 /// @param in       four control points
 /// @param[out] out four control points; may be `in`
 ZARNMATH_API void LeftOf(double t, const point2d* in, point2d* out) noexcept;
@@ -112,7 +115,8 @@ ZARNMATH_API void LeftOf(double t, const POINT* in, POINT* out) noexcept;
 
 /// The piece from t to 1, bit for bit the right piece of `Split`.
 ///
-/// @param t        parameter of the cut
+/// @param t        parameter of the cut; below 0 the piece begins on the extended polynomial, beyond 1 it runs backward
+///                 to P3, and at 1 it is the point P3 four times
 /// @param in       four control points
 /// @param[out] out four control points; may be `in`
 ZARNMATH_API void RightOf(double t, const point2d* in, point2d* out) noexcept;
@@ -175,7 +179,7 @@ ZARNMATH_API bool From3Points(POINT* out, const point2d& start, const vector2d& 
 
 /// The curvature at a parameter.
 ///
-/// @param t              parameter
+/// @param t              parameter; outside [0, 1] that of the extended polynomial
 /// @param a, b, c        power form
 /// @param[out] curvature in reciprocal drawing units
 /// @return false, with `curvature` untouched, where |P'(t)|^3 is not above 0. There is no tolerance, but the cube of a
@@ -185,19 +189,19 @@ ZARNMATH_API bool GetCurvatureAt(double t, const point2d& a, const point2d& b, c
 
 /// The radius of curvature at a parameter.
 ///
-/// @param t           parameter
+/// @param t           parameter; outside [0, 1] that of the extended polynomial
 /// @param a, b, c     power form
 /// @param[out] radius in drawing units; the largest double where the curve is straight or has a cusp
-/// @return false where Cross(P', P'') is exactly 0
+/// @return false where Cross(P', P'') is exactly 0; `radius` is written all the same
 ZARNMATH_API bool GetCurvatureRadiusAt(double t, const point2d& a, const point2d& b, const point2d& c,
                                        double& radius) noexcept;
 
 /// The curvature at a parameter, or near it.
 ///
-/// @param t       parameter
+/// @param t       parameter; outside [0, 1] that of the extended polynomial
 /// @param a, b, c power form
-/// @return the curvature at t; where it is undefined, that at t + 1e-05 for t <= 0.5 and at t - 1e-05 beyond, toward the
-///         middle of the curve; and 0.0 where that is undefined too
+/// @return the curvature at t, in reciprocal drawing units; where it is undefined, that at t + 1e-05 for t <= 0.5 and at
+///         t - 1e-05 beyond, toward the middle of the curve; and 0.0 where that is undefined too
 [[nodiscard]] ZARNMATH_API double SafeBezierCurvature(double t, const point2d& a, const point2d& b,
                                                       const point2d& c) noexcept;
 
@@ -229,7 +233,7 @@ ZARNMATH_API int FindCurvatureMinMax(const point2d& a, const point2d& b, const p
 /// curve with P1 = P0, the second step serves only control polygons of about 50 units or more; below that it is the
 /// direction of the whole curve.
 ///
-/// @param t          parameter
+/// @param t          parameter; outside [0, 1] that of the extended polynomial
 /// @param a, b, c, d power form
 /// @return the direction, of no meaningful length; (1, 0) for a curve whose last chord is exactly zero
 [[nodiscard]] ZARNMATH_API vector2d SafeBezierTangent(double t, const point2d& a, const point2d& b, const point2d& c,
@@ -237,9 +241,9 @@ ZARNMATH_API int FindCurvatureMinMax(const point2d& a, const point2d& b, const p
 
 /// @}
 /// @name Length
-/// Arc length by one pass of Gauss-Legendre quadrature of the speed, without control of the error. The nodes and weights
-/// are kept short, most of them at eight decimal places: at orders 5, 6 and 10 a straight unit segment is off by 1e-08
-/// already. A curve with a sharp turn between samples is off by far more.
+/// Arc length, in drawing units, by one pass of Gauss-Legendre quadrature of the speed, without control of the error. The
+/// nodes and weights are kept short, most of them at eight decimal places: at orders 5, 6 and 10 a straight unit segment
+/// is off by 1e-08 already. A curve with a sharp turn between samples is off by far more.
 ///
 /// The squared speed is evaluated as a quartic: where it all but vanishes, rounding can take it below zero, and the length
 /// is then NaN.
@@ -325,8 +329,16 @@ ZARNMATH_API bool FindClosestPointOnBezier(const point2d& a, const point2d& b, c
                                            const point2d& q, double& t, point2d& point,
                                            double& distanceSquared) noexcept;
 
-/// The nearest stationary point of a cubic given by four control points.
-/// @copydetails FindClosestPointOnBezier(const point2d&,const point2d&,const point2d&,const point2d&,const point2d&,double&,point2d&,double&)
+/// The nearest stationary point of a cubic given by its control points.
+///
+/// @param bezier               four control points
+/// @param q                    query point
+/// @param[out] t               parameter of the nearest point, in [0, 1] but for a double root, whose search is not
+///                             confined
+/// @param[out] point           the nearest point, by Horner's rule
+/// @param[out] distanceSquared its squared distance from q
+/// @return whether there is a stationary point. If not, the three results are untouched. Among equal distances the
+///         candidate that the root finder lists first stays. A curve collapsed to a point has none.
 ZARNMATH_API bool FindClosestPointOnBezier(const point2d* bezier, const point2d& q, double& t, point2d& point,
                                            double& distanceSquared) noexcept;
 
@@ -390,7 +402,8 @@ ZARNMATH_API bool GetSide(const point2d& a, const point2d& b, const point2d& c, 
 ///
 /// @param a, b, c, d         power form
 /// @param q                  the point
-/// @param[in,out] parameters the parameter is appended if 0 <= t <= 1 and the squared distance is below 0.01
+/// @param[in,out] parameters the parameter is appended if it lies in [0, 1] and the squared distance is below 0.01: at
+///                           most one, so that there is no order to it
 /// @return whether `parameters` is not empty afterwards: true as well where it was not empty before
 ZARNMATH_API bool Invert(const point2d& a, const point2d& b, const point2d& c, const point2d& d, const point2d& q,
                          std::vector<double>& parameters);
@@ -443,8 +456,8 @@ ZARNMATH_API void ConvertBezierToImplicit(const point2d& a, const point2d& b, co
 /// - both have no cubic term (a = (0, 0)), as two parabolas.
 ///
 /// @param first, second            four control points each
-/// @param[in,out] firstParameters  parameters on the first curve
-/// @param[in,out] secondParameters parameters on the second curve
+/// @param[in,out] firstParameters  parameters on the first curve, in [0, 1]
+/// @param[in,out] secondParameters parameters on the second curve, in [0, 1]
 /// @param[in,out] points           the points, on the curve that was substituted
 ///
 /// The three vectors are parallel and hold at most nine crossings more than before, in the root finder's order, neither
@@ -465,7 +478,7 @@ ZARNMATH_API void FindBezierIntersections(const POINT* first, const POINT* secon
 ///
 /// @param bezier                four control points
 /// @param line                  two points, at which the line's parameter is 0 and 1
-/// @param[out] bezierParameters parameters on the curve, at most four, in the root finder's order
+/// @param[out] bezierParameters parameters on the curve, in (0, 1) or [0, 1], at most four, in the root finder's order
 /// @param[out] lineParameters   parameters along the line, element for element; any real number
 /// @param includeEndpoints      whether t = 0 and t = 1 of the curve count. Even then t = 0 is dropped where the curve
 ///                              crosses twice besides
@@ -483,7 +496,7 @@ ZARNMATH_API bool FindBezierLineIntersection(const POINT* bezier, const POINT* l
 /// @param bezier             four control points
 /// @param x                  where the vertical line stands
 /// @param[in,out] parameters the parameters are appended, at most four, in the root finder's order
-/// @param includeEndpoints   whether t = 0 and t = 1 count
+/// @param includeEndpoints   whether the range is [0, 1] or (0, 1)
 /// @return whether `parameters` is not empty afterwards: true as well where it was not empty before
 ZARNMATH_API bool FindBezierIntersectionsAtX(const point2d* bezier, double x, std::vector<double>& parameters,
                                              bool includeEndpoints);
@@ -537,6 +550,7 @@ ZARNMATH_API bool FindBezierSelfIntersection(const POINT* bezier, double& first,
 /// Whether two cubics meet: share an end point exactly, or cross as `FindBezierIntersections` sees it.
 ///
 /// @param one, other four control points each
+/// @return whether they do; of two points, whether they are exactly equal
 [[nodiscard]] ZARNMATH_API bool DoBeziersIntersect(const point2d* one, const point2d* other);
 [[nodiscard]] ZARNMATH_API bool DoBeziersIntersect(const POINT* one, const POINT* other);
 
@@ -548,7 +562,7 @@ ZARNMATH_API bool FindBezierSelfIntersection(const POINT* bezier, double& first,
 ///
 /// @param bezier             four control points
 /// @param lineStart, lineEnd the segment, which may be without length
-/// @param halfWidth          the distance
+/// @param halfWidth          the distance, in drawing units
 [[nodiscard]] ZARNMATH_API bool DoesFatlineIntersectBezier(const point2d* bezier, const point2d& lineStart,
                                                            const point2d& lineEnd, double halfWidth) noexcept;
 
@@ -612,7 +626,7 @@ ZARNMATH_API void GetParallels(const point2d& a, const point2d& b, const point2d
 /// The parameters in (0, 1) at which the offset of a cubic has a cusp.
 ///
 /// @param a, b, c         power form
-/// @param distance        positive to the left of the direction of travel; 0 has no cusps
+/// @param distance        in drawing units, positive to the left of the direction of travel; 0 has no cusps
 /// @param[out] parameters cleared, then filled in the root finder's order, with at most 12 values
 /// @return whether there is any. A double root, where the radius only touches the distance, may be listed once, twice or
 ///         not at all, and so may a zero of the speed, which counts for positive distances

@@ -21,7 +21,7 @@ namespace ZarnMath {
 /// curves.
 ///
 /// @param a, b, c  power form
-/// @param distance positive to the left; with 0 every piece is valid
+/// @param distance in drawing units, positive to the left; with 0 every piece is valid
 /// @return whether any sample is straight, turns away, or has a radius that is not below the distance
 [[nodiscard]] ZARNMATH_API bool IsBezierValidForOffset(const point2d& a, const point2d& b, const point2d& c,
                                                        double distance) noexcept;
@@ -29,8 +29,8 @@ namespace ZarnMath {
 /// The same for control points.
 ///
 /// @param bezier   four control points
-/// @param distance positive to the left
-/// @return whether the piece can be offset
+/// @param distance in drawing units, positive to the left; with 0 every piece is valid
+/// @return whether the piece can be offset: a straight one, and a point, always
 [[nodiscard]] ZARNMATH_API bool IsBezierValidForOffset(const point2d* bezier, double distance) noexcept;
 
 /// The stretches of a cubic whose offset does not fold.
@@ -44,9 +44,11 @@ namespace ZarnMath {
 /// differ.
 ///
 /// @param bezier                  the curve
-/// @param[in,out] segments        the stretches are appended, in the order of the curve; may hold `bezier` itself
-/// @param distance                positive to the left
-/// @param[in,out] validityChanges the parameters at which a valid and an invalid piece meet are appended; may be null
+/// @param[in,out] segments        the stretches are appended, in the order of the curve, at most one more than there are
+///                                cusps, of which there are no more than 12; may hold `bezier` itself
+/// @param distance                in drawing units, positive to the left; with 0 the curve comes through unchanged
+/// @param[in,out] validityChanges the parameters in (0, 1) at which a valid and an invalid piece meet are appended, in
+///                                the order of the curve; may be null
 ZARNMATH_API void GetSegmentsToOffset(const CubicBezier::bezier2dT<point2d>& bezier,
                                       std::vector<CubicBezier::bezier2dT<point2d>>& segments, double distance,
                                       std::vector<double>* validityChanges);
@@ -59,9 +61,9 @@ ZARNMATH_API void GetSegmentsToOffset(const CubicBezier::bezier2dT<point2d>& bez
 ///
 /// @param bezier              four control points
 /// @param[out] offsetBezier   four control points, the best fit whether or not it is within tolerance; may be `bezier`
-/// @param distance            positive to the left
-/// @param tolerance           the *square* of a distance, in drawing units
-/// @param[out] splitParameter 0.5: where to cut the curve if the fit is not near enough
+/// @param distance            in drawing units, positive to the left
+/// @param tolerance           the *square* of a distance, in drawing units squared
+/// @param[out] splitParameter always 0.5, in the middle of 0 to 1: where to cut the curve if the fit is not near enough
 /// @return whether the largest squared distance of a sample from the fit, and by which the fit leaves the box of the
 ///         samples, is below the tolerance. A curve that is a point gives true and handles of NaN
 ZARNMATH_API bool FindBezierOffsetCurve(const point2d* bezier, point2d* offsetBezier, double distance, double tolerance,

@@ -31,11 +31,12 @@ namespace ZarnMath {
 ///
 /// @param curve    four control points
 /// @param maxLines the budget of segments
-/// @return the share of the budget, truncated
+/// @return the share of the budget, truncated; for a curve that is a point, the smallest share
 [[nodiscard]] ZARNMATH_API int CalculateNumBezierLines(const POINT* curve, int maxLines) noexcept;
 [[nodiscard]] ZARNMATH_API int CalculateNumBezierLines(const point2d* curve, int maxLines) noexcept;
 
-/// Samples a cubic at t = i/lines, each point anew, with the exact control points P0 and P3 at the ends.
+/// Samples a cubic at t = i/lines, each point anew, with the exact control points P0 and P3 at the ends. Nothing is made
+/// unique: a curve that is a point gives that point every time.
 ///
 /// @param curve    four control points
 /// @param[out] out lines + 1 points

@@ -139,10 +139,11 @@ ZARNMATH_API void InflateRect(RECT& rect, int dx, int dy) noexcept;
 ZARNMATH_API void GetRectCorners(const BoundsT<double>& box, point2d* out) noexcept;
 ZARNMATH_API void GetRectCorners(const RECT& box, POINT* out) noexcept;
 
-/// The centre in whole units, each coordinate truncated toward zero. A sum of two fields wraps in 32 bits.
+/// The centre of `rect` in whole units, each coordinate truncated toward zero. A sum of two fields wraps in 32 bits.
 [[nodiscard]] ZARNMATH_API POINT GetRectCenter(const RECT& rect) noexcept;
 
-/// Height times width, made positive: inside out counts as well. Heights and widths wrap in 32 bits.
+/// Height times width of `rect` in drawing units squared, made positive: inside out counts as well. Heights and widths
+/// wrap in 32 bits.
 [[nodiscard]] ZARNMATH_API double GetRectArea(const RECT& rect) noexcept;
 
 /// @}
@@ -171,14 +172,14 @@ ZARNMATH_API void GetRectCorners(const RECT& box, POINT* out) noexcept;
 /// The rectangle about a point. Its sides wrap in 32 bits, and a negative half extent turns it inside out.
 ///
 /// @param p      the centre
-/// @param r      half the width and half the height
+/// @param r      half the width and half the height, in drawing units
 /// @return left p.x - r, top p.y + r, right p.x + r, bottom p.y - r
 [[nodiscard]] ZARNMATH_API RECT GetPointRect(const POINT& p, int r) noexcept;
 
 /// The rectangle about a point, with half extents of its own for each axis.
 ///
 /// @param p      the centre
-/// @param rx, ry half the width, half the height
+/// @param rx, ry half the width, half the height, in drawing units
 /// @return left p.x - rx, top p.y + ry, right p.x + rx, bottom p.y - ry
 [[nodiscard]] ZARNMATH_API RECT GetPointRect(const POINT& p, int rx, int ry) noexcept;
 
@@ -240,7 +241,7 @@ ZARNMATH_API void GetRectCorners(const RECT& box, POINT* out) noexcept;
 /// atan, sin and cos).
 ///
 /// @param m      the transform; its translation is not used, and a singular one gives the right flat box
-/// @param radius the radius of the circle
+/// @param radius the radius of the circle, in drawing units
 /// @param centre the centre of the *ellipse*: it is not transformed
 /// @return the box, right beyond the limits of the 32-bit integers too
 [[nodiscard]] ZARNMATH_API BoundsT<double> GetTransformedCircleBBox(const MATRIX& m, double radius,

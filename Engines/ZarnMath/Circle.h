@@ -24,8 +24,8 @@ namespace ZarnMath {
 /// The lengths of the half axes of the unit circle's image (arithmetic).
 ///
 /// @param m          the transform; its translation is not used
-/// @param[out] major the longer half axis, at least 0
-/// @param[out] minor the shorter half axis, at least 0
+/// @param[out] major the longer half axis, at least 0; of a singular transform NaN, or a meaningless number
+/// @param[out] minor the shorter half axis, at least 0; of a singular transform 0
 ZARNMATH_API void GetTransformedCircleAxisLengths(const MATRIX& m, double& major, double& minor) noexcept;
 
 /// The half axes of the unit circle's image, perpendicular to each other (platform).

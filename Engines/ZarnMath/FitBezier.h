@@ -58,7 +58,7 @@ ZARNMATH_API void Calculate_u(const point2d* points, int count, std::vector<doub
 /// @param[out] worst_u the parameter of the point with the largest distance, of the last pass that had a point with
 ///                     any; may be null
 /// @param threshold    a pass that counts and has an error below it is the last one
-/// @return the error of the curve; the largest double, with nothing written, for fewer than two points
+/// @return the error of the curve, a squared distance; the largest double, with nothing written, for fewer than two points
 ZARNMATH_API double LeastSquares(const point2d* points, double* u, int count, const vector2d& t1, const vector2d& t2,
                                  point2d* bezier, int iterations, double* worst_u, double threshold) noexcept;
 
@@ -69,7 +69,7 @@ ZARNMATH_API double LeastSquares(const point2d* points, double* u, int count, co
 /// @param t1, t2      the tangents
 /// @param[out] bezier four control points
 /// @param iterations  the number of passes, at least 1
-/// @return the error of the curve; the largest double, with nothing written, for one point
+/// @return the error of the curve, a squared distance; the largest double, with nothing written, for one point
 /// @throws std::length_error for a count below 1
 ZARNMATH_API double LeastSquares(const point2d* points, int count, const vector2d& t1, const vector2d& t2,
                                  point2d* bezier, int iterations);
@@ -93,8 +93,8 @@ ZARNMATH_API double LeastSquares(const point2d* points, int count, const vector2
 /// @param iterations     the number of passes
 /// @param[out] worst_u   the parameter of the point with the largest distance, of the last pass that had a point with
 ///                       any; may be null
-/// @return the error of the curve; the largest double, with nothing written, for fewer than two points, and where there
-///         is no pass
+/// @return the error of the curve, a squared distance; the largest double, with nothing written, for fewer than two
+///         points, and where there is no pass
 ZARNMATH_API double LeastSquares(const point2d* points, double* u, int count, point2d* bezier, int iterations,
                                  double* worst_u) noexcept;
 
@@ -104,7 +104,8 @@ ZARNMATH_API double LeastSquares(const point2d* points, double* u, int count, po
 /// @param count          the number of points
 /// @param[in,out] bezier four control points, as in the form with parameters
 /// @param iterations     the number of passes
-/// @return the error of the curve; the largest double, with nothing written, for one point, and where there is no pass
+/// @return the error of the curve, a squared distance; the largest double, with nothing written, for one point, and where
+///         there is no pass
 /// @throws std::length_error for a count below 1
 ZARNMATH_API double LeastSquares(const point2d* points, int count, point2d* bezier, int iterations);
 
@@ -154,9 +155,9 @@ ZARNMATH_API double LeastSquares(const point2d* points, int n, int split, const 
 
 /// Fits the parabola y = c0 + c1*x + c2*x^2 to points, by the squares of the vertical distances.
 ///
-/// @param points               the points, in any order
+/// @param points               the points, in drawing units and in any order
 /// @param count                their number
-/// @param[in,out] coefficients c0, c1 and c2 are appended
+/// @param[in,out] coefficients c0, c1 and c2 are appended, in this order
 /// @return false, with nothing appended, for fewer than three points, and where the normal equations come out as exactly
 ///         singular, as for fewer than three different x
 ZARNMATH_API bool LeastSquares(const point2d* points, unsigned long count, std::vector<double>& coefficients);

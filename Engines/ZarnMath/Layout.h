@@ -32,8 +32,8 @@ enum class LayoutUnit : std::int32_t
 /// One length. A measure of an unknown kind counts as given, with the value that one not given would have.
 struct LayoutMeasure
 {
-    LayoutUnit kind;
-    double value;
+    LayoutUnit kind; ///< what the value means
+    double value;    ///< the number; not read where the kind is `LayoutUnit::None`
 
     friend constexpr bool operator==(const LayoutMeasure&, const LayoutMeasure&) noexcept = default;
 };
@@ -42,14 +42,14 @@ struct LayoutMeasure
 /// where it is given, the minimum has no effect. An alignment of another value leaves its edges where the rest put them.
 struct Layout
 {
-    LayoutMeasure width;
-    LayoutMeasure height;
-    LayoutMeasure minWidth;
-    LayoutMeasure minHeight;
-    LayoutMeasure leftMargin;
-    LayoutMeasure rightMargin;
-    LayoutMeasure topMargin;
-    LayoutMeasure bottomMargin;
+    LayoutMeasure width;          ///< of the object; with none it stretches
+    LayoutMeasure height;         ///< of the object; with none it stretches
+    LayoutMeasure minWidth;       ///< below which it does not stretch
+    LayoutMeasure minHeight;      ///< below which it does not stretch
+    LayoutMeasure leftMargin;     ///< from the left edge of the frame
+    LayoutMeasure rightMargin;    ///< from the right edge of the frame
+    LayoutMeasure topMargin;      ///< from the top of the frame
+    LayoutMeasure bottomMargin;   ///< from the bottom of the frame
     std::int32_t verticalAlign;   ///< 0 bottom, 1 top, 2 centre; the vertical one comes first
     std::int32_t horizontalAlign; ///< 0 left, 1 right, 2 centre
 

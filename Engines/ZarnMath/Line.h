@@ -31,7 +31,8 @@ namespace ZarnMath {
 /// Whether two segments cross, or come closer than a width.
 ///
 /// The crossing test is not symmetric: a and b may lie on the line cd, but c and d have to lie strictly on opposite sides
-/// of ab. Segments that touch in a T with c or d on ab, and collinear segments, meet only through a width above 0.
+/// of ab. Segments that touch in a T with c or d on ab, and collinear segments, meet only through a width above 0, and so
+/// does a segment that is a point.
 ///
 /// @param a, b  the first segment
 /// @param c, d  the second segment

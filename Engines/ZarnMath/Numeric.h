@@ -15,7 +15,7 @@ namespace ZarnMath {
 ///
 /// @param x     where
 /// @param mean  the mean
-/// @param sigma the standard deviation; its sign does not count
+/// @param sigma the standard deviation; its sign does not count, and 0 gives NaN
 /// @return the density at x
 [[nodiscard]] ZARNMATH_API double Gaussian(double x, double mean, double sigma) noexcept;
 
@@ -48,8 +48,8 @@ namespace ZarnMath {
 ///
 /// @param x    the ramp, 0 to 1; outside, the same formula
 /// @param gain taken into -1 to 1; 1 flattens the middle into 0.5 at either side, -1 steepens it into a step
-/// @return the bent value. Where the denominator of the lower half vanishes the result is 1, as at x = 0 with gain 1.
-///         At x = 1 with gain 1 it is NaN
+/// @return the bent value. Where the denominator of the lower half vanishes the result is 1: at x = 0 with gain 1, and at
+///         one x above the middle too with every gain below -1/3, as at x = 2/3 with -0.6. At x = 1 with gain 1 it is NaN
 [[nodiscard]] ZARNMATH_API double Gain(double x, double gain) noexcept;
 
 /// How far a step is on the way.
@@ -71,7 +71,7 @@ namespace ZarnMath {
 /// @param x    the ramp, 0 to 1
 /// @param gain for `Gain`, which comes second
 /// @param bias for `Bias`, which comes first
-/// @return Gain(Bias(x, bias), gain)
+/// @return Gain(Bias(x, bias), gain), NaN where either gives it
 [[nodiscard]] ZARNMATH_API double GetBiasGainBlendFactor(double x, double gain, double bias) noexcept;
 
 /// @}

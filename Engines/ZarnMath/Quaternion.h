@@ -15,22 +15,24 @@ namespace ZarnMath {
 /// counter-clockwise as seen against the axis.
 struct Quaternion
 {
-    double x;
-    double y;
-    double z;
+    double x; ///< along i
+    double y; ///< along j
+    double z; ///< along k
     double w; ///< the scalar part
 
-    /// The Hamilton product: as a rotation, the right operand acts first.
+    /// The Hamilton product: as a rotation, the right operand `other` acts first. Of unit quaternions it is one, but for
+    /// rounding; any others have a product too.
     [[nodiscard]] ZARNMATH_API Quaternion operator*(const Quaternion& other) const noexcept;
 
     /// Multiplies by a vector from one side only: the vector part of q * v. This is no rotation by q, but for q = 1.
     ///
-    /// @param[in,out] v the vector
+    /// @param[in,out] v the vector; any will do
     ZARNMATH_API void RotateQuick(vector3dT<double>& v) const noexcept;
 
     /// Rotates a vector: q * v * conjugate(q).
     ///
-    /// @param[in,out] v the vector; multiplied by the squared length of this quaternion, which should be 1
+    /// @param[in,out] v the vector; multiplied by the squared length of this quaternion, which should be 1. The zero
+    ///                  quaternion makes it zero
     ZARNMATH_API void Rotate(vector3dT<double>& v) const noexcept;
 
     /// Becomes (a x b, a . b): for unit vectors the rotation by twice the angle from a to b.
@@ -46,10 +48,10 @@ struct Quaternion
     /// short way round, and the result is not normalised.
     ///
     /// @param a, b     the ends
-    /// @param t        0 gives a, 1 gives b; any other number goes on along the great circle
+    /// @param t        0 to 1, from a to b; outside, it goes on along the great circle
     /// @param[out] out the quaternion in between; may be one of the ends
-    /// @return false if a and b are too close to equal or to opposite, 1 - |a . b| < 1e-08: out is then a, which serves
-    ///         as the result
+    /// @return false if a and b are too close to equal or to opposite, 1 - |a . b| < 1e-08: out is written, and is a,
+    ///         which serves as the result
     ZARNMATH_API static bool Interpolate(const Quaternion& a, const Quaternion& b, double t, Quaternion& out) noexcept;
 
     friend constexpr bool operator==(const Quaternion&, const Quaternion&) noexcept = default;

@@ -28,7 +28,7 @@ namespace ZarnMath {
 class TridiagonalMatrix
 {
 public:
-    /// Appends a row at the end.
+    /// Appends a row of any numbers at the end.
     ///
     /// @param a coefficient of the unknown before; in row 0 of a plain system ignored, of a cyclic one that of the last
     /// @param b coefficient of the row's own unknown

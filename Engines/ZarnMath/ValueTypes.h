@@ -36,8 +36,8 @@ using Framework::common_types::SIZE;
 template <typename T, bool IsPosition>
 struct vector2dT
 {
-    T x;
-    T y;
+    T x; ///< grows to the right
+    T y; ///< grows upward
 
     friend constexpr bool operator==(const vector2dT&, const vector2dT&) noexcept = default;
 };
@@ -51,9 +51,9 @@ using vector2d = vector2dT<double, false>;
 template <typename T>
 struct vector3dT
 {
-    T x;
-    T y;
-    T z;
+    T x; ///< grows to the right
+    T y; ///< grows upward
+    T z; ///< the third coordinate
 
     friend constexpr bool operator==(const vector3dT&, const vector3dT&) noexcept = default;
 };
@@ -77,13 +77,15 @@ namespace CubicBezier {
 template <typename P>
 struct bezier2dT
 {
-    P points[4];
+    P points[4]; ///< P0 to P3
 
+    /// Control point i, 0 to 3.
     constexpr P& operator[](std::size_t i) noexcept
     {
         return points[i];
     }
 
+    /// Control point i, 0 to 3.
     constexpr const P& operator[](std::size_t i) const noexcept
     {
         return points[i];
@@ -97,24 +99,28 @@ struct bezier2dT
 /// @name Arithmetic, component by component
 /// @{
 
+/// The displacement from b to a.
 template <typename T>
 [[nodiscard]] constexpr vector2dT<T, false> operator-(const vector2dT<T, true>& a, const vector2dT<T, true>& b) noexcept
 {
     return {a.x - b.x, a.y - b.y};
 }
 
+/// The position that v leads to from a.
 template <typename T>
 [[nodiscard]] constexpr vector2dT<T, true> operator+(const vector2dT<T, true>& a, const vector2dT<T, false>& v) noexcept
 {
     return {a.x + v.x, a.y + v.y};
 }
 
+/// The position from which v leads to a.
 template <typename T>
 [[nodiscard]] constexpr vector2dT<T, true> operator-(const vector2dT<T, true>& a, const vector2dT<T, false>& v) noexcept
 {
     return {a.x - v.x, a.y - v.y};
 }
 
+/// One displacement after the other.
 template <typename T>
 [[nodiscard]] constexpr vector2dT<T, false> operator+(const vector2dT<T, false>& v,
                                                       const vector2dT<T, false>& w) noexcept
@@ -122,6 +128,7 @@ template <typename T>
     return {v.x + w.x, v.y + w.y};
 }
 
+/// The displacement that, after w, makes v.
 template <typename T>
 [[nodiscard]] constexpr vector2dT<T, false> operator-(const vector2dT<T, false>& v,
                                                       const vector2dT<T, false>& w) noexcept
@@ -129,12 +136,14 @@ template <typename T>
     return {v.x - w.x, v.y - w.y};
 }
 
+/// v, s times as long.
 template <typename T>
 [[nodiscard]] constexpr vector2dT<T, false> operator*(const vector2dT<T, false>& v, std::type_identity_t<T> s) noexcept
 {
     return {v.x * s, v.y * s};
 }
 
+/// v, s times as long.
 template <typename T>
 [[nodiscard]] constexpr vector2dT<T, false> operator*(std::type_identity_t<T> s, const vector2dT<T, false>& v) noexcept
 {

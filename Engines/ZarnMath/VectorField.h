@@ -43,14 +43,16 @@ struct VectorField
 
     /// The empty field.
     VectorField() = default;
+    /// A copy of its own, content and bounds.
     VectorField(const VectorField&) = default;
+    /// The same; the rows that stood here are reused or released.
     VectorField& operator=(const VectorField&) = default;
     ~VectorField() = default;
 
-    /// Takes over the rows and copies the four integers; the source is left without rows.
+    /// Takes over the rows of `other` and copies its four integers; it is left without rows.
     ZARNMATH_API VectorField(VectorField&& other) noexcept;
 
-    /// The same; the rows that stood here are released.
+    /// The same; the rows that stood here are released, whether or not `other` has any.
     ZARNMATH_API VectorField& operator=(VectorField&& other) noexcept;
 
     /// @name Bounds
@@ -69,13 +71,13 @@ struct VectorField
     ///             counts as that
     ZARNMATH_API void Initialize(const RECT& rect);
 
-    /// Empties every row and keeps its storage. Bounds stay.
+    /// Empties every row and keeps its storage. Bounds stay; an empty field stays empty.
     ZARNMATH_API void ClearVectors() noexcept;
 
     /// Sets new bounds and keeps the content that lies inside them, in place in the plane. If an exception comes out,
     /// the field is as it was.
     ///
-    /// @param rect the new bounds, as for `Initialize`
+    /// @param rect the new bounds, as for `Initialize`; inside out, they make the field empty
     /// @return whether all of the old bounds lay inside rect; also true where the old field had no columns
     ZARNMATH_API bool Rebound(const RECT& rect);
 
@@ -102,7 +104,8 @@ struct VectorField
     /// @return whether it fitted whole; true for a source without columns
     ZARNMATH_API bool Blit(const VectorField& source, int dx, int dy);
 
-    /// Grows the bounds as by `Extend` to hold the moved source, and copies it in.
+    /// Grows the bounds as by `Extend` to hold the moved source, and copies it in. An empty source leaves bounds of two
+    /// cells or more each way as they are, and turns narrower ones into the empty field.
     ///
     /// @param source the field to copy
     /// @param dx, dy the offset

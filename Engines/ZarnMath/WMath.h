@@ -38,51 +38,65 @@ struct ZARNMATH_API MATRIX
     /// @name Application and product (arithmetic)
     /// @{
 
-    /// The image of a point: (dx + (m11*x + m12*y), dy + (m21*x + m22*y)).
+    /// The image of the point p = (x, y): (dx + (m11*x + m12*y), dy + (m21*x + m22*y)). Any matrix will do.
     [[nodiscard]] ZarnMath::point2d operator()(const ZarnMath::point2d& p) const noexcept;
 
-    /// The image of a displacement, which no translation moves: (m11*x + m12*y, m21*x + m22*y).
+    /// The image of the displacement v = (x, y), which no translation moves: (m11*x + m12*y, m21*x + m22*y). Any matrix
+    /// will do.
     [[nodiscard]] ZarnMath::vector2d operator()(const ZarnMath::vector2d& v) const noexcept;
 
-    /// The transform that does `other` first and this one after it: (a * b)(p) is a(b(p)), up to rounding.
+    /// The transform that does `other` first and this one after it: (a * b)(p) is a(b(p)), up to rounding. Any two
+    /// matrices have a product.
     [[nodiscard]] MATRIX operator*(const MATRIX& other) const noexcept;
 
     /// @}
     /// @name Steps added after what the matrix does
-    /// The arguments are read before the matrix is written, so that a matrix may be transformed by itself.
+    /// The arguments are read before the matrix is written, so that a matrix may be transformed by itself. Angles are in
+    /// radians, counter-clockwise. But for `Invert` no matrix is refused, a singular one included.
     /// @{
 
     /// Turns about the origin. No angle is exact, quarter turns and 0 included (platform).
+    ///
+    /// @param radians the angle, counter-clockwise
     void Rotate(double radians) noexcept;
 
     /// Turns about a point. No angle is exact, quarter turns and 0 included (platform).
+    ///
+    /// @param radians the angle, counter-clockwise
+    /// @param centre  the point about which it turns
     void RotateAroundPoint(double radians, const ZarnMath::point2d& centre) noexcept;
 
-    /// Does t about a point: Translate(centre) * t * Translate(-centre) * this (arithmetic).
+    /// Does t about a point, the centre: Translate(centre) * t * Translate(-centre) * this (arithmetic).
     void TransformAroundPoint(const MATRIX& t, const ZarnMath::point2d& centre) noexcept;
 
-    /// Scales about the origin: the first row by scale.x, the second by scale.y, translation included (arithmetic).
+    /// Scales about the origin: the first row by scale.x, the second by scale.y, translation included. A factor of 0
+    /// makes the matrix singular (arithmetic).
     void ScaleMatrix(const ZarnMath::vector2d& scale) noexcept;
 
     /// Scales about a point (arithmetic).
+    ///
+    /// @param scale  the factors along x and y; 0 makes the matrix singular
+    /// @param centre the point that stays where it is
     void ScaleMatrix(const ZarnMath::vector2d& scale, const ZarnMath::point2d& centre) noexcept;
 
     /// Brings each *row* of the linear part to length 1 by itself, as `Normalize` does, so that a row of squared length
     /// up to DBL_EPSILON stays. The translation stays too (arithmetic).
     ///
-    /// What turns first and scales after it comes out as the pure turn; what scales unevenly first does not.
+    /// What turns first and scales after it comes out as the pure turn; what scales unevenly first does not. A row of
+    /// zeros stays zero.
     void RemoveScaling() noexcept;
 
     /// Becomes its own inverse (arithmetic).
     ///
-    /// @param tolerance the determinant of the linear part has to exceed it in magnitude, strictly
+    /// @param tolerance the determinant of the linear part, a ratio of areas, has to exceed it in magnitude, strictly
     /// @return whether it did; if not, and if the determinant is NaN, all six fields are 0: the matrix is lost
     bool Invert(double tolerance) noexcept;
 
     /// @}
     /// @name Classification (arithmetic)
-    /// The translation plays no part in it. In the conditions |v| > t stands for the negation of |v| <= t, and m <= 0 for
-    /// that of m > 0, so that NaN counts as out of tolerance.
+    /// Of the predicates only `IsIdentity` looks at the translation. A tolerance is compared with fields of the linear
+    /// part, or with products of them: ratios, without a unit. In the conditions |v| > tolerance stands for the negation
+    /// of |v| <= tolerance, and m <= 0 for that of m > 0, so that NaN counts as out of tolerance.
     /// @{
 
     /// Whether this is the identity.
@@ -91,38 +105,44 @@ struct ZARNMATH_API MATRIX
     /// @param tolerance    how far each field may lie off
     [[nodiscard]] bool IsIdentity(bool useTolerance, double tolerance) const noexcept;
 
-    /// |m21| > t or |m12| > t
+    /// Whether |m21| > tolerance or |m12| > tolerance.
     [[nodiscard]] bool IsSkewedOrRotated(double tolerance = DBL_EPSILON) const noexcept;
 
-    /// |m21| > t or |m12| > t or m11 <= 0 or m22 <= 0: the signs of the diagonal alone, so that a half turn counts.
+    /// Whether |m21| > tolerance or |m12| > tolerance or m11 <= 0 or m22 <= 0: of the diagonal the signs alone, so that a
+    /// half turn counts.
     [[nodiscard]] bool IsSkewedOrRotatedOrMirrored(double tolerance = DBL_EPSILON) const noexcept;
 
-    /// |m11 - 1| > t or |m22 - 1| > t or |m21| > t or |m12| > t
+    /// Whether any of |m11 - 1|, |m22 - 1|, |m21| and |m12| is > tolerance.
     [[nodiscard]] bool IsScaledOrSkewedOrRotated(double tolerance = DBL_EPSILON) const noexcept;
 
-    /// |m21| > t or |m12| > t or m11 <= 0 or |m11 - m22| > t: a uniform negative scale counts.
+    /// Whether |m21| > tolerance or |m12| > tolerance or m11 <= 0 or |m11 - m22| > tolerance: a uniform negative scale
+    /// counts.
     [[nodiscard]] bool IsNonUniformScaledOrSkewedOrRotated(double tolerance = DBL_EPSILON) const noexcept;
 
-    /// Whether the length of either column is off 1. `IsOrthonormal` compares squares, to which the same tolerance is
-    /// about twice as strict.
+    /// Whether the length of either column is off 1 by more than the tolerance. `IsOrthonormal` compares squares, to which
+    /// the same tolerance is about twice as strict.
     [[nodiscard]] bool IsScaled(double tolerance = DBL_EPSILON) const noexcept;
 
     /// Whether the determinant is below 0. A singular matrix is not mirrored.
     [[nodiscard]] bool IsMirrored() const noexcept;
 
-    /// Whether the product of the columns is near 0. Perpendicular rows do not make a matrix orthogonal.
+    /// Whether the product of the columns is 0 within the tolerance. Perpendicular rows do not make a matrix orthogonal;
+    /// a column of zeros does.
     [[nodiscard]] bool IsOrthogonal(double tolerance = DBL_EPSILON) const noexcept;
 
-    /// Whether the columns have squared lengths near 1 and a product near 0.
+    /// Whether the columns have squared lengths of 1 and a product of 0, each within the tolerance.
     [[nodiscard]] bool IsOrthonormal(double tolerance = DBL_EPSILON) const noexcept;
 
-    /// Whether the columns have near squared lengths and a product near 0.
+    /// Whether the columns have equal squared lengths and a product of 0, each within the tolerance; so has a linear part
+    /// of zeros.
     [[nodiscard]] bool IsUniformOrthogonal(double tolerance = DBL_EPSILON) const noexcept;
 
-    /// Whether the linear part is near one of the eight that permute the axes and their directions.
+    /// Whether the linear part is, each field within the tolerance, one of the eight that permute the axes and their
+    /// directions.
     [[nodiscard]] bool IsOrthonormalAxisAligned(double tolerance = DBL_EPSILON) const noexcept;
 
-    /// The largest factor by which the linear part lengthens a vector: its larger singular value.
+    /// The largest factor by which the linear part lengthens a vector: its larger singular value, 0 for a linear part of
+    /// zeros.
     [[nodiscard]] double GetMaximumMatrixVectorScale() const noexcept;
 
     /// The one point that the transform leaves in place.
@@ -140,13 +160,19 @@ struct ZARNMATH_API MATRIX
 
     /// @}
     /// @name Directions through the linear part
+    /// Angles are in radians, counter-clockwise from the x axis.
     /// @{
 
-    /// The direction, from 0 to 2*pi, of the image of a direction (platform).
+    /// The direction, from 0 to 2*pi, of the image of a direction. Where a singular linear part makes it the zero vector,
+    /// the direction is 0, or pi, by the signs of its zeros (platform).
+    ///
+    /// @param radians the direction, of any size
     [[nodiscard]] double GetTransformedRadians(double radians) const noexcept;
 
     /// The direction, from 0 to 2*pi, whose image has the given direction; with a singular linear part the given one
     /// itself (platform).
+    ///
+    /// @param radians the direction of the image, of any size
     [[nodiscard]] double GetUntransformedRadians(double radians) const noexcept;
 
     /// The displacement whose image is v; v itself where the determinant is at most DBL_EPSILON in magnitude
@@ -167,15 +193,19 @@ struct ZARNMATH_API MATRIX
 
     /// As `TransformPoints`, and then every coordinate is clamped to -536870912 .. 536870911, a quarter of the range,
     /// silently.
+    ///
+    /// @param[in,out] points the points; may be null with a count of 0
+    /// @param count          their number
     void TransformPointsWithRangeCheck(Framework::common_types::POINT* points, unsigned long count) const noexcept;
 
     /// @}
 };
 
 /// @name The plain-C family
-/// Steps added after what a matrix does, in integer units: angles in millionths of a degree, centres and points in whole
-/// drawing units. Degrees become radians by the constant 0.017453292519943, which falls short of pi/180 by about 3e-16.
-/// No pointer may be null, but for an array of no points.
+/// Steps added after what a matrix does, in integer units: angles in millionths of a degree, counter-clockwise; centres
+/// and points in whole drawing units. Degrees become radians by the constant 0.017453292519943, which falls short of
+/// pi/180 by about 3e-16. No pointer may be null, but for an array of no points. Any matrix is accepted, a singular one
+/// too.
 /// @{
 extern "C" {
 
@@ -183,21 +213,40 @@ extern "C" {
 ZARNMATH_API void UTLGetIdentityMatrix(MATRIX* matrix) noexcept;
 
 /// Turns about the origin. A multiple of a full turn changes no bit; quarter turns are not exact (platform).
+///
+/// @param[in,out] matrix what is turned
+/// @param angle          in millionths of a degree
 ZARNMATH_API void UTLRotateMatrix(MATRIX* matrix, int angle) noexcept;
 
 /// Turns about (cx, cy). A multiple of a full turn changes no bit, and quarter turns are exact (platform, but for those).
+///
+/// @param[in,out] matrix what is turned
+/// @param angle          in millionths of a degree
+/// @param cx, cy         the centre; -2147483648 is negated to itself
 ZARNMATH_API void UTLRotateMatrixAround(MATRIX* matrix, int angle, int cx, int cy) noexcept;
 
-/// Adds to the translation (arithmetic).
+/// Adds (x, y) to the translation of `matrix` (arithmetic).
 ZARNMATH_API void UTLTranslateMatrix(MATRIX* matrix, int x, int y) noexcept;
 
 /// Scales about (cx, cy) (arithmetic).
+///
+/// @param[in,out] matrix what is scaled
+/// @param cx, cy         the centre; -2147483648 is negated to itself
+/// @param sx, sy         the factors; 0 makes the matrix singular
 ZARNMATH_API void UTLStretchMatrix(MATRIX* matrix, int cx, int cy, double sx, double sy) noexcept;
 
 /// Shears x by -tan(angleX) per y, then y by tan(angleY) per new x, about (cx, cy) (platform).
+///
+/// @param[in,out] matrix what is sheared
+/// @param angleX, angleY in millionths of a degree; near a quarter turn the tangent is huge
+/// @param cx, cy         the centre; -2147483648 is negated to itself
 ZARNMATH_API void UTLSkewMatrix(MATRIX* matrix, int angleX, int angleY, int cx, int cy) noexcept;
 
-/// `MATRIX::TransformPoints` with a signed count; one below 1 does nothing (arithmetic).
+/// `MATRIX::TransformPoints` with a signed count (arithmetic).
+///
+/// @param[in,out] points the points, each coordinate rounded by `RoundToInt`; may be null with a count below 1
+/// @param matrix         the transform
+/// @param count          their number; below 1 nothing happens
 ZARNMATH_API void UTLTransformPoint(Framework::common_types::POINT* points, const MATRIX* matrix,
                                     std::int64_t count) noexcept;
 }
@@ -209,10 +258,11 @@ namespace ZarnMath {
 /// @name Comparison of matrices (arithmetic)
 /// @{
 
-/// Whether |a.f - b.f| <= tolerance for all six fields; false with any NaN.
+/// Whether |a.f - b.f| <= tolerance for all six fields f; false with any NaN. One number serves the linear part, which
+/// holds ratios, and the translation, in drawing units.
 [[nodiscard]] ZARNMATH_API bool IsEqual(const MATRIX& a, const MATRIX& b, double tolerance) noexcept;
 
-/// Whether |f| <= tolerance for all six fields, translation included; false with any NaN.
+/// Whether |m.f| <= tolerance for all six fields f, the translation in drawing units included; false with any NaN.
 [[nodiscard]] ZARNMATH_API bool IsZero(const MATRIX& m, double tolerance = DBL_EPSILON) noexcept;
 
 /// @}
@@ -223,10 +273,11 @@ namespace Radians {
 /// The angle from 0 to 2*pi. A tiny negative one gives 2*pi itself, and a -0.0 stays (arithmetic).
 [[nodiscard]] ZARNMATH_API double NormalizeAngle(double angle) noexcept;
 
-/// The angle from -pi to pi, both included: what lies there already is returned as it is (arithmetic).
+/// The angle in radians from -pi to pi, both included: what lies there already is returned as it is, and so is NaN
+/// (arithmetic).
 [[nodiscard]] ZARNMATH_API double NormalizeFineAngle(double angle) noexcept;
 
-/// (cos, sin) of the angle, times a length (platform).
+/// (cos, sin) of the angle in radians, times a length; NaN for an infinite angle (platform).
 [[nodiscard]] ZARNMATH_API vector2d AngleToVector(double angle) noexcept;
 [[nodiscard]] ZARNMATH_API vector2d AngleToVector(double angle, double length) noexcept;
 
@@ -238,19 +289,22 @@ namespace Radians {
 /// @return the turn; 0 where either vector is zero, holds NaN, or the product of their squared lengths underflows
 [[nodiscard]] ZARNMATH_API double GetAngle(const vector2d& a, const vector2d& b) noexcept;
 
-/// The turn from a to b as seen from the vertex.
+/// The turn from a to b as seen from the vertex, from 0 to 2*pi; 0 where either of them is the vertex (platform).
 [[nodiscard]] ZARNMATH_API double GetAngle(const point2d& vertex, const point2d& a, const point2d& b) noexcept;
 
-/// `GetAngle` folded to above -pi up to pi: opposite vectors give pi whichever way they are turned (platform).
+/// `GetAngle` from a to b in radians, folded to above -pi up to pi: opposite vectors give pi whichever way they are
+/// turned, and 0 comes out where `GetAngle` gives it (platform).
 [[nodiscard]] ZARNMATH_API double GetFineAngle(const vector2d& a, const vector2d& b) noexcept;
 
-/// p turned about a centre, by way of its difference from the centre (platform).
+/// The point p turned by an angle in radians about a centre, by way of its difference from the centre. The centre
+/// itself stays, but no angle is exact otherwise, 0 included; an infinite one gives NaN (platform).
 [[nodiscard]] ZARNMATH_API point2d RotatePoint(const point2d& p, double angle, const point2d& centre) noexcept;
 
 /// The nearest of the angles origin + k * 2*pi/steps, not normalised; the angle itself if steps is 0 (arithmetic).
 [[nodiscard]] ZARNMATH_API double Constrain(double angle, int steps, double origin) noexcept;
 
-/// The quadrant, 0 to 3, of the normalised angle. A boundary belongs to the higher one; NaN gives 3 (arithmetic).
+/// The quadrant, 0 to 3, of the angle brought to a turn of 2*pi. A boundary belongs to the higher one; NaN gives 3
+/// (arithmetic).
 [[nodiscard]] ZARNMATH_API int GetQuadrant(double angle) noexcept;
 
 /// Turns points about a centre and rounds them, with the centre hoisted into two offsets, so that a point may come out
@@ -258,7 +312,7 @@ namespace Radians {
 ///
 /// @param[in,out] points the points
 /// @param count          their number; taken as signed, below 1 changes nothing
-/// @param angle          up to DBL_EPSILON radians in magnitude the array is left alone
+/// @param angle          in radians; up to DBL_EPSILON in magnitude the array is left alone
 /// @param centre         the fixed point
 ZARNMATH_API void RotatePoints(POINT* points, unsigned long count, double angle, const point2d& centre) noexcept;
 
@@ -271,29 +325,38 @@ namespace Degrees {
 /// The angle from 0 to 360. A tiny negative one gives 360 itself, and a -0.0 stays (arithmetic).
 [[nodiscard]] ZARNMATH_API double NormalizeAngle(double angle) noexcept;
 
-/// (cos, sin) of the angle, times a length (platform).
+/// (cos, sin) of the angle in degrees, times a length; NaN for an infinite angle (platform).
 [[nodiscard]] ZARNMATH_API vector2d AngleToVector(double angle) noexcept;
 [[nodiscard]] ZARNMATH_API vector2d AngleToVector(double angle, double length) noexcept;
 
 /// The direction of v from 0 to 360; 0 for the zero vector (platform).
 [[nodiscard]] ZARNMATH_API double VectorToAngle(const vector2d& v) noexcept;
 
-/// The turn from a to b, counter-clockwise, from 0 to 360, both included; 0 where `Radians::GetAngle` is (platform).
+/// The turn from a to b, counter-clockwise and as seen from the vertex, if there is one: from 0 to 360, both included; 0
+/// where `Radians::GetAngle` is (platform).
 [[nodiscard]] ZARNMATH_API double GetAngle(const vector2d& a, const vector2d& b) noexcept;
 [[nodiscard]] ZARNMATH_API double GetAngle(const point2d& vertex, const point2d& a, const point2d& b) noexcept;
 
-/// The turn from a to b, above -180 up to 180 (platform).
+/// The turn from a to b, above -180 up to 180; 0 where `Radians::GetAngle` is (platform).
 [[nodiscard]] ZARNMATH_API double GetFineAngle(const vector2d& a, const vector2d& b) noexcept;
 
-/// p turned about a centre (platform).
+/// The point p turned by an angle in degrees about a centre. The centre itself stays; an infinite angle gives NaN
+/// (platform).
 [[nodiscard]] ZARNMATH_API point2d RotatePoint(const point2d& p, double angle, const point2d& centre) noexcept;
 
 /// The room that a turned box takes, with its sides exchanged: at 0 degrees the width comes out as `cy` (platform).
 ///
+/// @param size  the box, in whole drawing units; of a negative side the magnitude counts
+/// @param angle in degrees, of any size
 /// @return cx: |cos*cy| + |sin*cx|, cy: |sin*cy| + |cos*cx|, each of the four products rounded up by itself
 [[nodiscard]] ZARNMATH_API SIZE GetRotatedSize(const SIZE& size, double angle) noexcept;
 
-/// As `Radians::RotatePoints`; the angle is compared with DBL_EPSILON after it has become radians (platform).
+/// As `Radians::RotatePoints` (platform).
+///
+/// @param[in,out] points the points
+/// @param count          their number; taken as signed, below 1 changes nothing
+/// @param angle          in degrees, compared with DBL_EPSILON after it has become radians
+/// @param centre         the fixed point
 ZARNMATH_API void RotatePoints(POINT* points, unsigned long count, double angle, const point2d& centre) noexcept;
 
 } // namespace Degrees
@@ -301,16 +364,17 @@ ZARNMATH_API void RotatePoints(POINT* points, unsigned long count, double angle,
 /// Angles as an `int` of millionths of a degree: a full turn is 360000000.
 namespace KELDANGLE {
 
-/// The angle from 0 to 359999999 (arithmetic).
+/// The angle from 0 to 359999999 millionths of a degree; any `int` will do (arithmetic).
 [[nodiscard]] ZARNMATH_API int NormalizeAngle(int angle) noexcept;
 
-/// The direction of v, rounded: 360000000 just below the x axis (platform).
+/// The direction of v, rounded: 360000000 just below the x axis, and 0 for (0, 0) (platform).
 [[nodiscard]] ZARNMATH_API int VectorToAngle(const vector2d& v) noexcept;
 
-/// The turn from a to b as seen from the vertex, from 0 to 360000000 (platform).
+/// The turn from a to b as seen from the vertex, from 0 to 360000000; 0 where either of them is the vertex (platform).
 [[nodiscard]] ZARNMATH_API int GetAngle(const point2d& vertex, const point2d& a, const point2d& b) noexcept;
 
-/// The turn from a to b as seen from the vertex, from -180000000 to 180000000 (platform).
+/// The turn from a to b as seen from the vertex, from -180000000 to 180000000; 0 where either of them is the vertex
+/// (platform).
 [[nodiscard]] ZARNMATH_API int GetFineAngle(const point2d& vertex, const point2d& a, const point2d& b) noexcept;
 
 } // namespace KELDANGLE
@@ -340,6 +404,11 @@ struct AFF_TRANSFORM
 ZARNMATH_API bool DecomposeAffineTransform(AFF_TRANSFORM& out, const MATRIX& m) noexcept;
 
 /// As `DecomposeAffineTransform`, of the transform with these columns.
+///
+/// @param[out] out         on false partly written, as by `DecomposeAffineTransform`
+/// @param origin           image of the origin
+/// @param xVector, yVector images of the unit vectors. A zero xVector gives NaN in `scaleY` and `skew`, and true
+/// @return whether the two vectors are further than 0.9 degrees from parallel, the second one not being zero
 ZARNMATH_API bool DecomposeAffineTransformFromVectors(AFF_TRANSFORM& out, const point2d& origin,
                                                       const vector2d& xVector, const vector2d& yVector) noexcept;
 
@@ -362,7 +431,8 @@ ZARNMATH_API bool ComposeAffineTransform(MATRIX& out, const AFF_TRANSFORM& a) no
 
 /// @}
 /// @name Construction
-/// Fields that are not named are 0.
+/// Fields that are not named are 0. Angles are in radians, counter-clockwise. Nothing is refused: a factor of 0 gives a
+/// singular matrix, and infinities and NaN go through.
 /// @{
 
 /// How a box is fitted into another. Any other value acts as `MapFill`.
@@ -379,30 +449,31 @@ enum MapMode : std::int32_t
 /// The mirror that exchanges x and y (arithmetic).
 [[nodiscard]] ZARNMATH_API MATRIX SwapXYMatrix() noexcept;
 
-/// The transform with these columns (arithmetic).
+/// The transform with the columns xVector, yVector and translation, whatever they are (arithmetic).
 [[nodiscard]] ZARNMATH_API MATRIX ConstructMatrix(const vector2d& xVector, const vector2d& yVector,
                                                   const vector2d& translation) noexcept;
 
 /// Moves by v (arithmetic).
 [[nodiscard]] ZARNMATH_API MATRIX ConstructTranslationMatrix(const vector2d& v) noexcept;
 
-/// Turns about the origin (platform).
+/// Turns about the origin by an angle in radians (platform).
 [[nodiscard]] ZARNMATH_API MATRIX ConstructRotationMatrix(double radians) noexcept;
 
-/// Scales, then turns, about the origin (platform).
+/// Scales by (sx, sy), then turns by an angle in radians, about the origin (platform).
 [[nodiscard]] ZARNMATH_API MATRIX ConstructScaledRotationMatrix(double sx, double sy, double radians) noexcept;
 
-/// Turns about a point (platform).
+/// Turns by an angle in radians about a point, the centre (platform).
 [[nodiscard]] ZARNMATH_API MATRIX ConstructRotateAroundMatrix(double radians, const point2d& centre) noexcept;
 
-/// Scales about a point (arithmetic).
+/// Scales by (sx, sy) about a point, the centre (arithmetic).
 [[nodiscard]] ZARNMATH_API MATRIX ConstructScaleAroundMatrix(double sx, double sy, const point2d& centre) noexcept;
 
-/// Shears x by -tan(angleX) per y, then y by tan(angleY) per new x, about a point; angles in radians (platform).
+/// Shears x by -tan(angleX) per y, then y by tan(angleY) per new x, about a point, the centre; angles in radians
+/// (platform).
 [[nodiscard]] ZARNMATH_API MATRIX ConstructSkewAroundMatrix(double angleX, double angleY,
                                                             const point2d& centre) noexcept;
 
-/// Does t about a point (arithmetic).
+/// Does t about a point, the centre (arithmetic).
 [[nodiscard]] ZARNMATH_API MATRIX ConstructTransformAroundMatrix(const MATRIX& t, const point2d& centre) noexcept;
 
 /// The turn and uniform scale that takes one displacement to another, without translation (platform).
@@ -429,7 +500,8 @@ enum MapMode : std::int32_t
 [[nodiscard]] ZARNMATH_API MATRIX ConstructRectTransformMatrix(const BoundsT<double>& from, const BoundsT<double>& to,
                                                                MapMode mode) noexcept;
 
-/// The factors that take one size to another, chosen as in `ConstructRectTransformMatrix` (arithmetic).
+/// The factors that take the size `from` to the size `to`, chosen by `mode` as in `ConstructRectTransformMatrix`. A side
+/// of 0 in `from` gives infinities or NaN (arithmetic).
 [[nodiscard]] ZARNMATH_API vector2d GetScaleForSizeTransform(const vector2d& from, const vector2d& to,
                                                              MapMode mode) noexcept;
 

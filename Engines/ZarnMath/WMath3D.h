@@ -22,7 +22,7 @@
 /// The rotation part, columns 0 to 2, is fixed point with 65536 for 1; the translation is in whole units.
 struct MATRIX3D
 {
-    std::int32_t m[3][4];
+    std::int32_t m[3][4]; ///< m[row][column]
 
     friend constexpr bool operator==(const MATRIX3D&, const MATRIX3D&) noexcept = default;
 };
@@ -30,21 +30,21 @@ struct MATRIX3D
 /// A position in space, in whole units.
 struct POINT3D
 {
-    std::int32_t x;
-    std::int32_t y;
-    std::int32_t z;
+    std::int32_t x; ///< grows to the right
+    std::int32_t y; ///< grows upward
+    std::int32_t z; ///< distance from the plane of projection
 
     friend constexpr bool operator==(const POINT3D&, const POINT3D&) noexcept = default;
 };
 
 extern "C" {
 
-/// The identity.
+/// The identity, whatever stood in the matrix.
 ///
 /// @param[out] out 65536 on the diagonal, 0 elsewhere
 ZARNMATH_API void MTHGet3DIdentityMatrix(MATRIX3D* out) noexcept;
 
-/// Adds a translation after what the matrix does.
+/// Adds a translation after what the matrix does, whatever that is. Sums wrap in 32 bits.
 ///
 /// @param[in,out] m the matrix, of which column 3 changes
 /// @param x, y, z   the translation

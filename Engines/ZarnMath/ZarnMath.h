@@ -1,5 +1,17 @@
 /// @file
 /// The whole library.
+///
+/// @namespace ZarnMath
+/// Everything but the matrices and the plain-C families, which stand in the global namespace.
+///
+/// @namespace ZarnMath::CubicBezier
+/// What can be asked of one cubic Bezier segment, or of two.
+///
+/// @namespace ZarnUtils
+/// What is shared with the application's other libraries.
+///
+/// @namespace Framework::common_types
+/// The integer types that are shared with the application.
 #pragma once
 
 #include "ZarnMath/Bezier.h"

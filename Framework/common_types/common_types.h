@@ -9,8 +9,8 @@ namespace Framework::common_types {
 /// A position in whole drawing units.
 struct POINT
 {
-    std::int32_t x;
-    std::int32_t y;
+    std::int32_t x; ///< grows to the right
+    std::int32_t y; ///< grows upward
 
     friend constexpr bool operator==(const POINT&, const POINT&) noexcept = default;
 };
@@ -18,8 +18,8 @@ struct POINT
 /// An extent in whole drawing units.
 struct SIZE
 {
-    std::int32_t cx;
-    std::int32_t cy;
+    std::int32_t cx; ///< width
+    std::int32_t cy; ///< height
 
     friend constexpr bool operator==(const SIZE&, const SIZE&) noexcept = default;
 };
