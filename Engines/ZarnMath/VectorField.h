@@ -44,8 +44,13 @@ struct VectorField
     /// The empty field.
     VectorField() = default;
     VectorField(const VectorField&) = default;
-    VectorField& operator=(const VectorField&) = default;
     ~VectorField() = default;
+
+    /// A copy. If an exception comes out, the field is as it was.
+    VectorField& operator=(const VectorField& other)
+    {
+        return *this = VectorField(other);
+    }
 
     /// Takes over the rows and copies the four integers; the source is left without rows.
     ZARNMATH_API VectorField(VectorField&& other) noexcept;
