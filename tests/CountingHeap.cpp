@@ -1,21 +1,25 @@
 #include "tests/CountingHeap.h"
 
 #include <cstdlib>
-#include <new>
 
 namespace {
 
-struct
+constexpr std::size_t anySize = std::numeric_limits<std::size_t>::max();
+
+struct Record
 {
     bool isWatched = false;
-    long untilFailure = 0; ///< counted down; nothing fails from 0 on
+    long untilFailure = ZarnMath::HeapWatch::never; ///< counted down; nothing fails from 0 on
+    std::size_t largest = anySize;
     long allocations = 0;
     long releases = 0;
-} heap;
+};
 
-bool IsToFail() noexcept
+thread_local Record heap;
+
+bool IsToFail(std::size_t size) noexcept
 {
-    return heap.isWatched && heap.untilFailure > 0 && --heap.untilFailure == 0;
+    return heap.isWatched && (size > heap.largest || (heap.untilFailure > 0 && --heap.untilFailure == 0));
 }
 
 void* Counted(void* block)
@@ -38,13 +42,13 @@ void Release(void* block) noexcept
 
 void* operator new(std::size_t size)
 {
-    return Counted(IsToFail() ? nullptr : std::malloc(size == 0 ? 1 : size));
+    return Counted(IsToFail(size) ? nullptr : std::malloc(size == 0 ? 1 : size));
 }
 
 void* operator new(std::size_t size, std::align_val_t alignment)
 {
     const auto unit = static_cast<std::size_t>(alignment);
-    return Counted(IsToFail() ? nullptr : std::aligned_alloc(unit, (size + unit - 1) / unit * unit));
+    return Counted(IsToFail(size) ? nullptr : std::aligned_alloc(unit, (size + unit - 1) / unit * unit));
 }
 
 void operator delete(void* block) noexcept
@@ -69,9 +73,16 @@ void operator delete(void* block, std::size_t, std::align_val_t) noexcept
 
 namespace ZarnMath {
 
-HeapWatch::HeapWatch(long failing) noexcept
+HeapWatch::HeapWatch(long failing, std::size_t largest) noexcept
 {
-    heap = {true, failing, 0, 0};
+    heap = {true, failing, largest, 0, 0};
+}
+
+HeapWatch::HeapWatch(long failing) noexcept : HeapWatch(failing, anySize) {}
+
+HeapWatch HeapWatch::WithoutBlocksAbove(std::size_t largest) noexcept
+{
+    return {never, largest};
 }
 
 HeapWatch::~HeapWatch()

@@ -147,9 +147,13 @@ bool AreSame(const vector2d* p, const vector2d* q)
     return true;
 }
 
+/// How many levels the deepest search so far went down, that of the whole polygon included.
+inline int deepestLevel = 0;
+
 template <int N>
-void Solve(const vector2d* bez, const double* c, double* roots, int& count)
+void Solve(const vector2d* bez, const double* c, double* roots, int& count, int level = 1)
 {
+    deepestLevel = std::max(deepestLevel, level);
     const double width = bez[N].x - bez[0].x;
     int lastCrossing = -1;
     const int n = CountCrossings<N>(bez, lastCrossing);
@@ -193,10 +197,10 @@ void Solve(const vector2d* bez, const double* c, double* roots, int& count)
         roots[count++] = bez[0].x;
         return;
     }
-    Solve<N>(left, c, roots, count);
+    Solve<N>(left, c, roots, count, level + 1);
     if (count > N - 1)
         return;
-    Solve<N>(right, c, roots, count);
+    Solve<N>(right, c, roots, count, level + 1);
 }
 
 inline int FindQuadraticRoots(const double* c, double* roots, bool includeEndpoints)

@@ -119,6 +119,18 @@ public:
         });
     }
 
+    /// Two roots next to 0 below a last ordinate that is huge: the last sign change stays at the last leg, where a cut
+    /// takes off least, all the way down.
+    Coefficients<N> SteepEnds()
+    {
+        const auto magnitude = [this](double exponent) { return std::pow(10.0, exponent + 10.0 * Uniform()); };
+        Coefficients<N> c{};
+        c[0] = magnitude(290.0);
+        c[N - 1] = -magnitude(0.0);
+        c[N] = magnitude(-30.0);
+        return c;
+    }
+
     bool Coin()
     {
         return Below(2) == 0;
@@ -173,7 +185,7 @@ struct Kind
 };
 
 template <int N>
-constexpr std::array<Kind<N>, 12> kinds = {{
+constexpr std::array<Kind<N>, 13> kinds = {{
     {"random ordinates", &Polynomials<N>::RandomOrdinates},
     {"whole ordinates", &Polynomials<N>::WholeOrdinates},
     {"ordinates of any magnitude", &Polynomials<N>::AnyMagnitude},
@@ -186,6 +198,7 @@ constexpr std::array<Kind<N>, 12> kinds = {{
     {"squares, all roots double", &Polynomials<N>::Squares},
     {"vanishing ends", &Polynomials<N>::VanishingEnds},
     {"close pairs of roots", &Polynomials<N>::ClosePairs},
+    {"steep ends", &Polynomials<N>::SteepEnds},
 }};
 
 template <typename Degree>
@@ -208,11 +221,16 @@ std::array<double, N + 3> Untouched()
     return values;
 }
 
-TYPED_TEST(RootFinderAgainstLiteral, GivesTheSameBits)
+/// A cut at the last of two changes leaves at most (N - 1)/N of the width, and none is made at a width of 2^-52.
+template <int N>
+const int mostLevels = 1 + static_cast<int>(std::ceil(52.0 / std::log2(N / (N - 1.0))));
+
+TYPED_TEST(RootFinderAgainstLiteral, GivesTheSameBitsAndGoesNoDeeperThanTheFloorAllows)
 {
     constexpr int N = TypeParam::value;
-    constexpr int casesOfAKind = 900; // 108,000 polynomials over all kinds and degrees
+    constexpr int casesOfAKind = 900; // 117,000 polynomials over all kinds and degrees
     Polynomials<N> polynomials;
+    Literal::deepestLevel = 0;
     for (const auto& [name, draw] : kinds<N>) {
         for (int i = 0; i < casesOfAKind; ++i) {
             const Coefficients<N> c = (polynomials.*draw)();
@@ -222,11 +240,13 @@ TYPED_TEST(RootFinderAgainstLiteral, GivesTheSameBits)
             const int expectedCount = Literal::FindRoots<N>(c.data(), expected.data(), includeEndpoints);
             const int count = RootFinder::FindRoots<N>(c.data(), actual.data(), includeEndpoints);
             ASSERT_EQ(count, expectedCount) << name << ", case " << i;
+            ASSERT_LE(Literal::deepestLevel, mostLevels<N>) << name << ", case " << i;
             for (std::size_t k = 0; k < expected.size(); ++k)
                 ASSERT_TRUE(Literal::HasSameBits(actual[k], expected[k]))
                     << name << ", case " << i << ", element " << k << ": " << actual[k] << " for " << expected[k];
         }
     }
+    EXPECT_EQ(Literal::deepestLevel, mostLevels<N>); // the steep ends go all the way
 }
 
 TYPED_TEST(RootFinderAgainstLiteral, ContinuesAnArrayThatHoldsRootsAlready)

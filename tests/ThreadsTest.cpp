@@ -4,6 +4,10 @@
 #include "ZarnMath/TridiagonalMatrix.h"
 #include "ZarnMath/VectorField.h"
 
+#include "tests/catalogue/Catalogue.h"
+#include "tests/catalogue/OrdinarySource.h"
+#include "tests/catalogue/RecordingSink.h"
+
 #include <gtest/gtest.h>
 
 #include <atomic>
@@ -40,6 +44,8 @@ VectorField MakeField()
     return field;
 }
 
+// The two things that are made on first use come first, before any thread has them.
+
 TEST(Threads, DrawAtOnce)
 {
     std::atomic<int> outside{0};
@@ -52,6 +58,21 @@ TEST(Threads, DrawAtOnce)
         }
     });
     EXPECT_EQ(outside, 0);
+}
+
+TEST(Threads, AskForTheUnitSquareAtOnce)
+{
+    std::atomic<const BoundsT<double>*> first{nullptr};
+    std::atomic<int> different{0};
+    RunTogether([&](int) {
+        const BoundsT<double>* mine = &IdentityBounds();
+        const BoundsT<double>* expected = nullptr;
+        if (!first.compare_exchange_strong(expected, mine) && expected != mine)
+            ++different;
+        if (*mine != BoundsT<double>{0.0, 1.0, 1.0, 0.0})
+            ++different;
+    });
+    EXPECT_EQ(different, 0);
 }
 
 TEST(Threads, SampleOneField)
@@ -96,19 +117,27 @@ TEST(Threads, SolveOnOneMatrix)
     EXPECT_EQ(different, 0);
 }
 
-TEST(Threads, AskForTheUnitSquareFirst)
+/// What every function of the catalogue says, one after the other.
+Catalogue::Record CallAll(const std::vector<Catalogue::Function>& functions)
 {
-    std::atomic<const BoundsT<double>*> first{nullptr};
-    std::atomic<int> different{0};
-    RunTogether([&](int) {
-        const BoundsT<double>* mine = &IdentityBounds();
-        const BoundsT<double>* expected = nullptr;
-        if (!first.compare_exchange_strong(expected, mine) && expected != mine)
-            ++different;
-        if (*mine != BoundsT<double>{0.0, 1.0, 1.0, 0.0})
-            ++different;
-    });
-    EXPECT_EQ(different, 0);
+    Catalogue::RecordingSink sink;
+    for (const Catalogue::Function& function : functions)
+        for (const unsigned firstCall : {0U, 1U, 2U}) {
+            Catalogue::OrdinarySource source(firstCall != 2, firstCall);
+            (*function.call)(source, sink);
+        }
+    return sink.Taken();
+}
+
+TEST(Threads, CallEveryFunctionAtOnce)
+{
+    const std::vector<Catalogue::Function> functions = Catalogue::ListFunctions();
+    Catalogue::Record records[threads];
+    RunTogether([&](int i) { records[i] = CallAll(functions); });
+    const Catalogue::Record alone = CallAll(functions);
+    EXPECT_GT(alone.size(), functions.size());
+    for (const Catalogue::Record& record : records)
+        EXPECT_EQ(record, alone);
 }
 
 } // namespace

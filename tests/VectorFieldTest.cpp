@@ -1,8 +1,8 @@
 #include "ZarnMath/VectorField.h"
 
 #include "ZarnMath/Bounds.h"
+#include "tests/CountingHeap.h"
 #include "tests/DenseRow.h"
-#include "tests/ScarceHeap.h"
 
 #include <cstring>
 #include <random>
@@ -166,7 +166,7 @@ TEST(VectorField, InitializeWithoutMemoryLeavesTheFieldEmpty)
 {
     VectorField field = FullField(4, 3, 7, 7);
     {
-        const Scarcity scarcity(1000);
+        const auto scarcity = HeapWatch::WithoutBlocksAbove(1000);
         EXPECT_THROW(field.Initialize(10, 1000, 1, 2), std::bad_alloc);
     }
     EXPECT_TRUE(field.rows.empty());
@@ -211,10 +211,11 @@ TEST(VectorField, ClearKeepsBoundsAndStorage)
         EXPECT_EQ(row.start, 0U);
         EXPECT_EQ(row.end, 0U);
     }
-    const std::size_t before = CountAllocations();
-    for (int x = 1; x <= 6; ++x)
-        field.SetVector(x, 3, {1.0F, 1.0F});
-    EXPECT_EQ(CountAllocations(), before);
+    const auto refill = [&field] {
+        for (int x = 1; x <= 6; ++x)
+            field.SetVector(x, 3, {1.0F, 1.0F});
+    };
+    EXPECT_EQ(AllocationsOf(refill), 0);
 }
 
 TEST(VectorField, ReboundKeepsWhatOverlapsInPlace)
@@ -258,12 +259,12 @@ TEST(VectorField, ReboundWithoutMemoryLeavesTheFieldAsItWas)
     VectorField field = FullField(40, 5, 0, 0);
     const VectorField before = field;
     {
-        const Scarcity scarcity(1000);
+        const auto scarcity = HeapWatch::WithoutBlocksAbove(1000);
         EXPECT_THROW(field.Rebound({0, 999, 9, 0}), std::bad_alloc); // no room for the new rows
     }
     EXPECT_TRUE(HasSameContent(field, before));
     {
-        const Scarcity scarcity(300);
+        const auto scarcity = HeapWatch::WithoutBlocksAbove(300);
         EXPECT_THROW(field.Rebound({0, 3, 99, 0}), std::bad_alloc); // no room for their cells
     }
     EXPECT_TRUE(HasSameContent(field, before));
@@ -661,11 +662,12 @@ TEST(VectorFieldGet, NegativeZeroAndSmallestSteps)
 TEST(VectorFieldGet, AllocatesNothing)
 {
     const VectorField field = FullField(16, 16, 0, 0);
-    const std::size_t before = CountAllocations();
     float sum = 0.0F;
-    for (int i = 0; i < 100; ++i)
-        sum += field.Get({static_cast<float>(i) * 0.17F, 3.3F}).x;
-    EXPECT_EQ(CountAllocations(), before);
+    const auto sample = [&] {
+        for (int i = 0; i < 100; ++i)
+            sum += field.Get({static_cast<float>(i) * 0.17F, 3.3F}).x;
+    };
+    EXPECT_EQ(AllocationsOf(sample), 0);
     EXPECT_GT(sum, 0.0F);
 }
 

@@ -119,7 +119,7 @@ namespace ZarnMath::CubicBezier::BezierOld {
 inline constexpr int maxIntersections = 9;
 
 /// The crossings of two cubics by halving both down to a fixed depth, where their chords are taken for them (Lane and
-/// Riesenfeld, 1980). It serves the search of a curve against itself.
+/// Riesenfeld, 1980). It serves the search of a curve against itself. The recursion is nine levels deep at most.
 ///
 /// A pair is given up where either half is below one unit in both directions, so that only curves of more than about
 /// 2^7 units are searched to the end. Crossings come depth first, the left halves before the right ones, and are not

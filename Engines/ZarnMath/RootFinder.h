@@ -7,8 +7,11 @@
 /// often than its polygon does (variation diminishing; Lane and Riesenfeld, 1981), so that a polygon with no sign change
 /// has no root, one with a single change has one, which Newton's method polishes, and every other one is cut.
 ///
-/// Everything runs on fixed-size arrays of the stack and allocates nothing. All loops have a length known to the
-/// compiler and are unrolled: that alone is worth a factor of two here.
+/// Everything runs on fixed-size arrays of the stack and allocates nothing. An interval is not cut below a width of 2^-52,
+/// and a cut leaves at most (N - 1)/N of it, so that a search goes 1 + ceil(52/log2(N/(N - 1))) levels down at most: 90
+/// for a cubic, 416 at degree 12. A polynomial that is huge at t = 1 and has two roots next to 0 reaches that.
+///
+/// All loops have a length known to the compiler and are unrolled: that alone is worth a factor of two here.
 #pragma once
 
 #include "ZarnMath/Bezier/Pair.h"

@@ -45,9 +45,13 @@ struct VectorField
     VectorField() = default;
     /// A copy of its own, content and bounds.
     VectorField(const VectorField&) = default;
-    /// The same; the rows that stood here are reused or released.
-    VectorField& operator=(const VectorField&) = default;
     ~VectorField() = default;
+
+    /// A copy of its own, content and bounds. If an exception comes out, the field is as it was.
+    VectorField& operator=(const VectorField& other)
+    {
+        return *this = VectorField(other);
+    }
 
     /// Takes over the rows of `other` and copies its four integers; it is left without rows.
     ZARNMATH_API VectorField(VectorField&& other) noexcept;

@@ -37,6 +37,22 @@ struct interval_vector
     /// @param cells     the length
     interval_vector(T fillValue, std::uint64_t cells) : fill(std::move(fillValue)), length(cells) {}
 
+    interval_vector(const interval_vector&) = default;
+    interval_vector(interval_vector&&) noexcept = default;
+    interval_vector& operator=(interval_vector&&) noexcept = default;
+    ~interval_vector() = default;
+
+    /// Copies another vector. The cells come first: if there is no memory for them, the run still fits those that stand.
+    interval_vector& operator=(const interval_vector& other)
+    {
+        data = other.data;
+        fill = other.fill;
+        start = other.start;
+        end = other.end;
+        length = other.length;
+        return *this;
+    }
+
     /// Cell i, or `fill` outside the run; beyond the length too. One comparison serves both ends of the run: the
     /// difference of an index below it wraps to beyond any size.
     [[nodiscard]] const T& operator[](std::uint64_t i) const noexcept

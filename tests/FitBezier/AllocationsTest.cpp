@@ -2,7 +2,7 @@
 #include "ZarnMath/BezierOffset.h"
 #include "ZarnMath/FitBezier.h"
 
-#include "tests/FailingAllocations.h"
+#include "tests/CountingHeap.h"
 #include "tests/FitBezier/Runs.h"
 #include "tests/Sentinels.h"
 
@@ -27,7 +27,7 @@ PointRun ArchRun()
 TEST(Allocations, ChordLengthParameters)
 {
     const PointRun run = ArchRun();
-    const int allocations = FailEveryAllocation(
+    const long allocations = FailEveryAllocation(
         [&] {
             std::vector<double> u;
             Calculate_u(run.points.data(), 12, u);
@@ -88,7 +88,7 @@ TEST(Allocations, ParabolaAppendsAllOrNothing)
 {
     const PointRun run = ArchRun();
     std::size_t size = 0;
-    const int allocations = FailEveryAllocation(
+    const long allocations = FailEveryAllocation(
         [&] {
             size = 1;
             std::vector<double> coefficients(1, 7.0);
@@ -105,24 +105,32 @@ TEST(Allocations, ParabolaAppendsAllOrNothing)
     EXPECT_EQ(allocations, 2); // the vector as it was, and its growth
 }
 
-TEST(Allocations, OffsetSegments)
+bool HasSamePoints(const CubicBezier::bezier2dT<point2d>& a, const Cubic& b)
 {
-    const CubicBezier::bezier2dT<point2d> curve{{arch[0], arch[1], arch[2], arch[3]}};
-    const int allocations = FailEveryAllocation(
-        [&] {
-            Segments segments;
-            std::vector<double> validityChanges;
-            GetSegmentsToOffset(curve, segments, -100.0, &validityChanges);
-        },
-        [] {});
-    EXPECT_GE(allocations, 3);
+    return std::equal(b.begin(), b.end(), a.points);
+}
+
+TEST(Allocations, OffsetSegmentsKeepWhatWasThere)
+{
+    const auto call = [] {
+        Segments segments{{{arch[0], arch[1], arch[2], arch[3]}}};
+        std::vector<double> validityChanges{sentinel<double>};
+        try {
+            GetSegmentsToOffset(segments[0], segments, -100.0, &validityChanges);
+        } catch (const std::bad_alloc&) {
+            EXPECT_TRUE(HasSamePoints(segments[0], arch));
+            EXPECT_EQ(validityChanges[0], sentinel<double>);
+            throw;
+        }
+    };
+    EXPECT_GE(FailEveryAllocation(call, [] {}), 5);
 }
 
 TEST(Allocations, OffsetCurveReservesItsSamplesOnce)
 {
     Bezier offset;
     double splitParameter = sentinel<double>;
-    const int allocations =
+    const long allocations =
         FailEveryAllocation([&] { FindBezierOffsetCurve(arch.data(), offset.data(), 10.0, 1.0, splitParameter); },
                             [&] { EXPECT_TRUE(offset.IsUntouchedFrom(0)); });
     EXPECT_EQ(allocations, 4); // parameters, points, and those of the fit
