@@ -63,6 +63,7 @@ namespace ZarnMath::CubicBezier {
 /// @param in         four control points
 /// @param[out] left  four control points of the piece from 0 to t
 /// @param[out] right four control points of the piece from t to 1
+/// @arithmetic
 ZARNMATH_API void Split(double t, const point2d* in, point2d* left, point2d* right) noexcept;
 ZARNMATH_API void Split(double t, const POINT* in, POINT* left, POINT* right) noexcept;
 
@@ -72,6 +73,7 @@ ZARNMATH_API void Split(double t, const POINT* in, POINT* left, POINT* right) no
 /// @param in         four control points
 /// @param[out] left  four control points of the first half
 /// @param[out] right four control points of the second half
+/// @arithmetic
 ZARNMATH_API void Split(const point2d* in, point2d* left, point2d* right) noexcept;
 
 /// Cuts at one half in whole units: each of the six midpoints is (p + q)/2 in 32-bit integers, truncated toward zero.
@@ -81,6 +83,7 @@ ZARNMATH_API void Split(const point2d* in, point2d* left, point2d* right) noexce
 /// @param in         four control points
 /// @param[out] left  four control points of the first half
 /// @param[out] right four control points of the second half
+/// @arithmetic
 ZARNMATH_API void Split(const POINT* in, POINT* left, POINT* right) noexcept;
 
 /// Cuts at t into one run of points.
@@ -88,6 +91,7 @@ ZARNMATH_API void Split(const POINT* in, POINT* left, POINT* right) noexcept;
 /// @param t        parameter of the cut; outside [0, 1] the pieces describe the extended polynomial
 /// @param in       four control points
 /// @param[out] out seven points: the left piece in elements 0 to 3, the right piece in 3 to 6
+/// @arithmetic
 ZARNMATH_API void Split(double t, const point2d* in, point2d* out) noexcept;
 ZARNMATH_API void Split(double t, const POINT* in, POINT* out) noexcept;
 
@@ -101,6 +105,7 @@ ZARNMATH_API void Split(double t, const POINT* in, POINT* out) noexcept;
 ///                 last piece describe the extended polynomial
 /// @param in       four control points
 /// @param[out] out ten points: the pieces in elements 0 to 3, 3 to 6 and 6 to 9
+/// @arithmetic
 ZARNMATH_API void Split(double t0, double t1, const point2d* in, point2d* out) noexcept;
 ZARNMATH_API void Split(double t0, double t1, const POINT* in, POINT* out) noexcept;
 
@@ -110,6 +115,7 @@ ZARNMATH_API void Split(double t0, double t1, const POINT* in, POINT* out) noexc
 ///                 backward from P0, and at 0 it is the point P0 four times
 /// @param in       four control points
 /// @param[out] out four control points; may be `in`
+/// @arithmetic
 ZARNMATH_API void LeftOf(double t, const point2d* in, point2d* out) noexcept;
 ZARNMATH_API void LeftOf(double t, const POINT* in, POINT* out) noexcept;
 
@@ -119,6 +125,7 @@ ZARNMATH_API void LeftOf(double t, const POINT* in, POINT* out) noexcept;
 ///                 to P3, and at 1 it is the point P3 four times
 /// @param in       four control points
 /// @param[out] out four control points; may be `in`
+/// @arithmetic
 ZARNMATH_API void RightOf(double t, const point2d* in, point2d* out) noexcept;
 ZARNMATH_API void RightOf(double t, const POINT* in, POINT* out) noexcept;
 
@@ -132,6 +139,7 @@ ZARNMATH_API void RightOf(double t, const POINT* in, POINT* out) noexcept;
 /// @param t0, t1   parameters of the piece
 /// @param in       four control points
 /// @param[out] out four control points
+/// @arithmetic
 ZARNMATH_API void Subsection(double t0, double t1, const point2d* in, point2d* out) noexcept;
 ZARNMATH_API void Subsection(double t0, double t1, const POINT* in, POINT* out) noexcept;
 
@@ -152,6 +160,7 @@ ZARNMATH_API void Subsection(double t0, double t1, const POINT* in, POINT* out) 
 /// @param[out] out            four control points: the rounded start, start + 2/3*(Q - start), Q + 1/3*(end - Q) and end
 /// @param start, through, end the points, in curve order
 /// @param simple              asks for the simple arc, which is taken anyway where `through` or end coincides with start
+/// @arithmetic
 ZARNMATH_API void From3Points(POINT* out, const point2d& start, const point2d& through, const point2d& end,
                               bool simple) noexcept;
 
@@ -166,6 +175,7 @@ ZARNMATH_API void From3Points(POINT* out, const point2d& start, const point2d& t
 /// @param endTangent            the line of the tangent at end, of any length
 /// @return false, with `out` untouched, where |Cross(startTangent, endTangent)| <= DBL_EPSILON: the tangents are parallel,
 ///         or too short
+/// @arithmetic
 ZARNMATH_API bool From3Points(POINT* out, const point2d& start, const vector2d& startTangent, const point2d& through,
                               const point2d& end, const vector2d& endTangent) noexcept;
 
@@ -184,6 +194,7 @@ ZARNMATH_API bool From3Points(POINT* out, const point2d& start, const vector2d& 
 /// @param[out] curvature in reciprocal drawing units
 /// @return false, with `curvature` untouched, where |P'(t)|^3 is not above 0. There is no tolerance, but the cube of a
 ///         speed below about 1e-108 underflows to 0
+/// @arithmetic
 ZARNMATH_API bool GetCurvatureAt(double t, const point2d& a, const point2d& b, const point2d& c,
                                  double& curvature) noexcept;
 
@@ -193,6 +204,7 @@ ZARNMATH_API bool GetCurvatureAt(double t, const point2d& a, const point2d& b, c
 /// @param a, b, c     power form
 /// @param[out] radius in drawing units; the largest double where the curve is straight or has a cusp
 /// @return false where Cross(P', P'') is exactly 0; `radius` is written all the same
+/// @arithmetic
 ZARNMATH_API bool GetCurvatureRadiusAt(double t, const point2d& a, const point2d& b, const point2d& c,
                                        double& radius) noexcept;
 
@@ -202,6 +214,7 @@ ZARNMATH_API bool GetCurvatureRadiusAt(double t, const point2d& a, const point2d
 /// @param a, b, c power form
 /// @return the curvature at t, in reciprocal drawing units; where it is undefined, that at t + 1e-05 for t <= 0.5 and at
 ///         t - 1e-05 beyond, toward the middle of the curve; and 0.0 where that is undefined too
+/// @arithmetic
 [[nodiscard]] ZARNMATH_API double SafeBezierCurvature(double t, const point2d& a, const point2d& b,
                                                       const point2d& c) noexcept;
 
@@ -213,6 +226,7 @@ ZARNMATH_API bool GetCurvatureRadiusAt(double t, const point2d& a, const point2d
 /// @param a, b, c  power form
 /// @param[out] out two values
 /// @return 2; or 0, with `out` untouched, where the discriminant is negative
+/// @arithmetic
 ZARNMATH_API int BezierInflectionPoints(const point2d& a, const point2d& b, const point2d& c, double* out) noexcept;
 
 /// The parameters in (0, 1) at which the derivative of |P'|^6 vanishes, where the speed is extreme.
@@ -224,6 +238,7 @@ ZARNMATH_API int BezierInflectionPoints(const point2d& a, const point2d& b, cons
 /// @param a, b, c  power form
 /// @param[out] out room for 11 values, of which the count is written, in the root finder's order
 /// @return the number of parameters
+/// @arithmetic
 ZARNMATH_API int FindCurvatureMinMax(const point2d& a, const point2d& b, const point2d& c, double* out) noexcept;
 
 /// The direction in which a cubic runs at a parameter.
@@ -236,6 +251,7 @@ ZARNMATH_API int FindCurvatureMinMax(const point2d& a, const point2d& b, const p
 /// @param t          parameter; outside [0, 1] that of the extended polynomial
 /// @param a, b, c, d power form
 /// @return the direction, of no meaningful length; (1, 0) for a curve whose last chord is exactly zero
+/// @arithmetic
 [[nodiscard]] ZARNMATH_API vector2d SafeBezierTangent(double t, const point2d& a, const point2d& b, const point2d& c,
                                                       const point2d& d) noexcept;
 
@@ -255,6 +271,7 @@ ZARNMATH_API int FindCurvatureMinMax(const point2d& a, const point2d& b, const p
 /// @param order   number of samples: below 2 counts as 2, 9 as 10, above 10 as 16
 /// @param t0, t1  the stretch; beyond [0, 1] that of the extended polynomial
 /// @return the length, negative for t1 < t0
+/// @arithmetic
 [[nodiscard]] ZARNMATH_API double Length(const point2d& a, const point2d& b, const point2d& c, int order, double t0,
                                          double t1) noexcept;
 
@@ -263,6 +280,7 @@ ZARNMATH_API int FindCurvatureMinMax(const point2d& a, const point2d& b, const p
 /// @param a, b, c  power form
 /// @param accuracy number of samples
 /// @return the length
+/// @arithmetic
 [[nodiscard]] ZARNMATH_API double Length(const point2d& a, const point2d& b, const point2d& c,
                                          LengthAccuracy accuracy) noexcept;
 
@@ -271,6 +289,7 @@ ZARNMATH_API int FindCurvatureMinMax(const point2d& a, const point2d& b, const p
 /// @param curve    four control points
 /// @param accuracy number of samples
 /// @return the length
+/// @arithmetic
 template <typename P>
 [[nodiscard]] double Length(const P* curve, LengthAccuracy accuracy) noexcept;
 
@@ -281,6 +300,7 @@ extern template ZARNMATH_API double Length<point2d>(const point2d*, LengthAccura
 /// @param t     parameter; outside [0, 1] the piece is extrapolated
 /// @param curve four control points; the piece of an integer curve is not rounded
 /// @return the length, exactly 0.0 for t = 0
+/// @arithmetic
 [[nodiscard]] ZARNMATH_API double LengthTo(double t, const point2d* curve) noexcept;
 [[nodiscard]] ZARNMATH_API double LengthTo(double t, const POINT* curve) noexcept;
 
@@ -289,6 +309,7 @@ extern template ZARNMATH_API double Length<point2d>(const point2d*, LengthAccura
 /// @param t     parameter; outside [0, 1] the piece is extrapolated
 /// @param curve four control points; the piece of an integer curve is not rounded
 /// @return the length, exactly 0.0 for t = 1
+/// @arithmetic
 [[nodiscard]] ZARNMATH_API double LengthFrom(double t, const point2d* curve) noexcept;
 [[nodiscard]] ZARNMATH_API double LengthFrom(double t, const POINT* curve) noexcept;
 
@@ -303,6 +324,7 @@ extern template ZARNMATH_API double Length<point2d>(const point2d*, LengthAccura
 ///                  within DBL_EPSILON. After 200 passes it ends as well, and with a tolerance of 0 usually so
 /// @param accuracy  number of samples
 /// @return the parameter; 0.5 for a curve of no length
+/// @arithmetic
 [[nodiscard]] ZARNMATH_API double GetCurveRelativeLengthParameter(double fraction, point2d a, point2d b, point2d c,
                                                                   double tolerance, LengthAccuracy accuracy) noexcept;
 
@@ -325,6 +347,7 @@ extern template ZARNMATH_API double Length<point2d>(const point2d*, LengthAccura
 /// @param[out] distanceSquared its squared distance from q
 /// @return whether there is a stationary point. If not, the three results are untouched. Among equal distances the
 ///         candidate that the root finder lists first stays. A curve collapsed to a point has none.
+/// @arithmetic
 ZARNMATH_API bool FindClosestPointOnBezier(const point2d& a, const point2d& b, const point2d& c, const point2d& d,
                                            const point2d& q, double& t, point2d& point,
                                            double& distanceSquared) noexcept;
@@ -339,6 +362,7 @@ ZARNMATH_API bool FindClosestPointOnBezier(const point2d& a, const point2d& b, c
 /// @param[out] distanceSquared its squared distance from q
 /// @return whether there is a stationary point. If not, the three results are untouched. Among equal distances the
 ///         candidate that the root finder lists first stays. A curve collapsed to a point has none.
+/// @arithmetic
 ZARNMATH_API bool FindClosestPointOnBezier(const point2d* bezier, const point2d& q, double& t, point2d& point,
                                            double& distanceSquared) noexcept;
 
@@ -351,6 +375,7 @@ ZARNMATH_API bool FindClosestPointOnBezier(const point2d* bezier, const point2d&
 /// @param[out] point           the nearest point, rounded
 /// @param[out] distanceSquared the squared distance of the *unrounded* point from q
 /// @return whether there is a stationary point; if not, the three results are untouched
+/// @arithmetic
 ZARNMATH_API bool FindClosestPointOnBezier(const POINT* bezier, const POINT& q, double& t, POINT& point,
                                            double& distanceSquared) noexcept;
 
@@ -359,6 +384,7 @@ ZARNMATH_API bool FindClosestPointOnBezier(const POINT* bezier, const POINT& q, 
 /// @param bezier four control points
 /// @param q      query point
 /// @return the parameter; where there is no stationary point, 0.0 if P0 is strictly nearer to q than P3, otherwise 1.0
+/// @arithmetic
 [[nodiscard]] ZARNMATH_API double FindClosestPointOnBezier(const POINT* bezier, const POINT& q) noexcept;
 
 /// All stationary points of the squared distance, in the open interval (0, 1).
@@ -369,6 +395,7 @@ ZARNMATH_API bool FindClosestPointOnBezier(const POINT* bezier, const POINT& q, 
 /// @param[in,out] points          the points; those of the `POINT` overload are rounded
 /// @param[in,out] squaredDistances squared distances from q to these points (to the rounded ones, for `POINT`)
 /// @return whether anything was found. The three vectors are appended to, never cleared, and not sorted by distance.
+/// @arithmetic
 ZARNMATH_API bool FindClosestPointsOnBezier(const point2d* bezier, const point2d& q, std::vector<double>& ts,
                                             std::vector<point2d>& points, std::vector<double>& squaredDistances);
 ZARNMATH_API bool FindClosestPointsOnBezier(const POINT* bezier, const POINT& q, std::vector<double>& ts,
@@ -384,6 +411,7 @@ ZARNMATH_API bool FindClosestPointsOnBezier(const POINT* bezier, const POINT& q,
 /// @param[out] side            the side of q; `SideNone` where q lies on the tangent line, on the curve itself included
 /// @return whether a nearest point was found with t in [0, 1]. If none was found, nothing is written; if t is out of
 ///         range, the first three are written and side is untouched.
+/// @arithmetic
 ZARNMATH_API bool GetSide(const point2d& a, const point2d& b, const point2d& c, const point2d& d, const point2d& q,
                           double& t, point2d& point, double& distanceSquared, Side& side) noexcept;
 
@@ -392,6 +420,7 @@ ZARNMATH_API bool GetSide(const point2d& a, const point2d& b, const point2d& c, 
 /// @param a, b, c, d power form
 /// @param q          query point
 /// @return the side, and `SideNone` too where there is no nearest point
+/// @arithmetic
 [[nodiscard]] ZARNMATH_API Side GetSide(const point2d& a, const point2d& b, const point2d& c, const point2d& d,
                                         const point2d& q) noexcept;
 
@@ -405,6 +434,7 @@ ZARNMATH_API bool GetSide(const point2d& a, const point2d& b, const point2d& c, 
 /// @param[in,out] parameters the parameter is appended if it lies in [0, 1] and the squared distance is below 0.01: at
 ///                           most one, so that there is no order to it
 /// @return whether `parameters` is not empty afterwards: true as well where it was not empty before
+/// @arithmetic
 ZARNMATH_API bool Invert(const point2d& a, const point2d& b, const point2d& c, const point2d& d, const point2d& q,
                          std::vector<double>& parameters);
 
@@ -415,6 +445,7 @@ ZARNMATH_API bool Invert(const point2d& a, const point2d& b, const point2d& c, c
 /// @param[out] parameters room for five values, of which the count is written, in the root finder's order (where the
 ///                        quartic is really of degree 2 or less, element 0 may be written although the count is 0)
 /// @return the number of parameters
+/// @arithmetic
 ZARNMATH_API int FindTangentsToPoint(const point2d& a, const point2d& b, const point2d& c, const point2d& d,
                                      const point2d& q, double* parameters) noexcept;
 
@@ -433,6 +464,7 @@ ZARNMATH_API int FindTangentsToPoint(const point2d& a, const point2d& b, const p
 ///
 /// @param a, b, c, d power form
 /// @param[out] Kxxx, Kyyy, Kxxy, Kxyy, Kxx, Kyy, Kxy, Kx, Ky, K1 the coefficients, both pure cubes first
+/// @arithmetic
 ZARNMATH_API void ConvertBezierToImplicit(const point2d& a, const point2d& b, const point2d& c, const point2d& d,
                                           double& Kxxx, double& Kyyy, double& Kxxy, double& Kxyy, double& Kxx,
                                           double& Kyy, double& Kxy, double& Kx, double& Ky, double& K1) noexcept;
@@ -463,6 +495,7 @@ ZARNMATH_API void ConvertBezierToImplicit(const point2d& a, const point2d& b, co
 /// The three vectors are parallel and hold at most nine crossings more than before, in the root finder's order, neither
 /// sorted nor made unique. Pass empty ones: crossings with a straight curve are appended, all others replace what the
 /// vectors held.
+/// @arithmetic
 ZARNMATH_API void FindBezierIntersections(const point2d* first, const point2d* second,
                                           std::vector<double>& firstParameters, std::vector<double>& secondParameters,
                                           std::vector<point2d>& points);
@@ -484,6 +517,7 @@ ZARNMATH_API void FindBezierIntersections(const POINT* first, const POINT* secon
 ///                              crosses twice besides
 /// @return whether anything was found. Both vectors are cleared first, and stay empty where the two points of the line
 ///         are exactly equal.
+/// @arithmetic
 ZARNMATH_API bool FindBezierLineIntersection(const point2d* bezier, const point2d* line,
                                              std::vector<double>& bezierParameters, std::vector<double>& lineParameters,
                                              bool includeEndpoints);
@@ -498,6 +532,7 @@ ZARNMATH_API bool FindBezierLineIntersection(const POINT* bezier, const POINT* l
 /// @param[in,out] parameters the parameters are appended, at most four, in the root finder's order
 /// @param includeEndpoints   whether the range is [0, 1] or (0, 1)
 /// @return whether `parameters` is not empty afterwards: true as well where it was not empty before
+/// @arithmetic
 ZARNMATH_API bool FindBezierIntersectionsAtX(const point2d* bezier, double x, std::vector<double>& parameters,
                                              bool includeEndpoints);
 
@@ -507,6 +542,7 @@ ZARNMATH_API bool FindBezierIntersectionsAtX(const point2d* bezier, double x, st
 /// @param bezier four control points
 /// @param line   the two ends of the segment
 /// @return whether there is a crossing with t in (0, 1) and u in [0, 1]; false for a segment without length
+/// @arithmetic
 [[nodiscard]] ZARNMATH_API bool DoesBezierIntersectLineSegment(const point2d* bezier, const point2d* line) noexcept;
 [[nodiscard]] ZARNMATH_API bool DoesBezierIntersectLineSegment(const POINT* bezier, const POINT* line) noexcept;
 
@@ -525,6 +561,7 @@ ZARNMATH_API bool FindBezierIntersectionsAtX(const point2d* bezier, double x, st
 /// @param[out] earlyStart, earlyEnd   the stretch of the earlier pass, likewise
 /// @param allowClosed                 whether a curve whose ends coincide counts as crossing itself there
 /// @return whether the curve crosses itself. If not, the four results may have been written, or not, and mean nothing.
+/// @arithmetic
 ZARNMATH_API bool DoesBezierSelfIntersect(const point2d* bezier, double& lateStart, double& lateEnd, double& earlyStart,
                                           double& earlyEnd, bool allowClosed) noexcept;
 ZARNMATH_API bool DoesBezierSelfIntersect(const POINT* bezier, double& lateStart, double& lateEnd, double& earlyStart,
@@ -542,6 +579,7 @@ ZARNMATH_API bool DoesBezierSelfIntersect(const POINT* bezier, double& lateStart
 /// @return whether it was found. If not, the results may have been written, and mean nothing. Where one of the
 ///         stretches is a point, the crossing is at an end of the curve, and first is the smaller parameter: 0 and 1
 ///         for a closed curve.
+/// @arithmetic
 ZARNMATH_API bool FindBezierSelfIntersection(const point2d* bezier, double& first, double& second,
                                              point2d& point) noexcept;
 ZARNMATH_API bool FindBezierSelfIntersection(const POINT* bezier, double& first, double& second,
@@ -551,6 +589,7 @@ ZARNMATH_API bool FindBezierSelfIntersection(const POINT* bezier, double& first,
 ///
 /// @param one, other four control points each
 /// @return whether they do; of two points, whether they are exactly equal
+/// @arithmetic
 [[nodiscard]] ZARNMATH_API bool DoBeziersIntersect(const point2d* one, const point2d* other);
 [[nodiscard]] ZARNMATH_API bool DoBeziersIntersect(const POINT* one, const POINT* other);
 
@@ -563,6 +602,7 @@ ZARNMATH_API bool FindBezierSelfIntersection(const POINT* bezier, double& first,
 /// @param bezier             four control points
 /// @param lineStart, lineEnd the segment, which may be without length
 /// @param halfWidth          the distance, in drawing units
+/// @arithmetic
 [[nodiscard]] ZARNMATH_API bool DoesFatlineIntersectBezier(const point2d* bezier, const point2d& lineStart,
                                                            const point2d& lineEnd, double halfWidth) noexcept;
 
@@ -577,6 +617,7 @@ ZARNMATH_API bool FindBezierSelfIntersection(const POINT* bezier, double& first,
 /// @param a, b, c            power form
 /// @param[in,out] parameters at most two are appended, in ascending order. The ends of the curve are never among them, and
 ///                           nothing is for a vertical straight curve
+/// @arithmetic
 ZARNMATH_API void GetVerticalTangents(const point2d& a, const point2d& b, const point2d& c,
                                       std::vector<double>& parameters);
 
@@ -585,6 +626,7 @@ ZARNMATH_API void GetVerticalTangents(const point2d& a, const point2d& b, const 
 /// @param a, b, c            power form
 /// @param[in,out] parameters at most two are appended, in ascending order. The ends of the curve are never among them, and
 ///                           nothing is for a horizontal straight curve
+/// @arithmetic
 ZARNMATH_API void GetHorizontalTangents(const point2d& a, const point2d& b, const point2d& c,
                                         std::vector<double>& parameters);
 
@@ -595,6 +637,7 @@ ZARNMATH_API void GetHorizontalTangents(const point2d& a, const point2d& b, cons
 /// @param[in,out] parameters at most two are appended, in ascending order; a double root at 0 is appended twice
 /// @param[out] allParallel   whether the tangent is parallel to the direction everywhere, each coefficient of the quadratic
 ///                           being at most DBL_EPSILON; nothing is appended then
+/// @arithmetic
 ZARNMATH_API void GetParallels(const point2d& a, const point2d& b, const point2d& c, const vector2d& direction,
                                std::vector<double>& parameters, bool& allParallel);
 
@@ -605,6 +648,7 @@ ZARNMATH_API void GetParallels(const point2d& a, const point2d& b, const point2d
 ///
 /// @param a, b, c, d power form
 /// @return the area, in drawing units squared
+/// @arithmetic
 [[nodiscard]] ZARNMATH_API double GetAreaUnderBezier(const point2d& a, const point2d& b, const point2d& c,
                                                      const point2d& d) noexcept;
 
@@ -615,6 +659,7 @@ ZARNMATH_API void GetParallels(const point2d& a, const point2d& b, const point2d
 /// @param offset, scale the product is the distance, positive to the left of the direction of travel
 /// @return P(t) + offset*scale*Perpendicular(n), with n the normalised `SafeBezierTangent`. Where that is too short to be
 ///         normalised, the point lies nearer
+/// @arithmetic
 [[nodiscard]] ZARNMATH_API point2d MapToBezier(const point2d* bezier, double t, double offset, double scale) noexcept;
 
 /// @}
@@ -630,6 +675,7 @@ ZARNMATH_API void GetParallels(const point2d& a, const point2d& b, const point2d
 /// @param[out] parameters cleared, then filled in the root finder's order, with at most 12 values
 /// @return whether there is any. A double root, where the radius only touches the distance, may be listed once, twice or
 ///         not at all, and so may a zero of the speed, which counts for positive distances
+/// @arithmetic
 ZARNMATH_API bool FindOffsetCusps(const point2d& a, const point2d& b, const point2d& c, double distance,
                                   std::vector<double>& parameters);
 

@@ -23,6 +23,7 @@ namespace ZarnMath {
 /// @param a, b, c  power form
 /// @param distance in drawing units, positive to the left; with 0 every piece is valid
 /// @return whether any sample is straight, turns away, or has a radius that is not below the distance
+/// @arithmetic
 [[nodiscard]] ZARNMATH_API bool IsBezierValidForOffset(const point2d& a, const point2d& b, const point2d& c,
                                                        double distance) noexcept;
 
@@ -31,6 +32,7 @@ namespace ZarnMath {
 /// @param bezier   four control points
 /// @param distance in drawing units, positive to the left; with 0 every piece is valid
 /// @return whether the piece can be offset: a straight one, and a point, always
+/// @arithmetic
 [[nodiscard]] ZARNMATH_API bool IsBezierValidForOffset(const point2d* bezier, double distance) noexcept;
 
 /// The stretches of a cubic whose offset does not fold.
@@ -49,6 +51,7 @@ namespace ZarnMath {
 /// @param distance                in drawing units, positive to the left; with 0 the curve comes through unchanged
 /// @param[in,out] validityChanges the parameters in (0, 1) at which a valid and an invalid piece meet are appended, in
 ///                                the order of the curve; may be null
+/// @platform
 ZARNMATH_API void GetSegmentsToOffset(const CubicBezier::bezier2dT<point2d>& bezier,
                                       std::vector<CubicBezier::bezier2dT<point2d>>& segments, double distance,
                                       std::vector<double>* validityChanges);
@@ -66,6 +69,7 @@ ZARNMATH_API void GetSegmentsToOffset(const CubicBezier::bezier2dT<point2d>& bez
 /// @param[out] splitParameter always 0.5, in the middle of 0 to 1: where to cut the curve if the fit is not near enough
 /// @return whether the largest squared distance of a sample from the fit, and by which the fit leaves the box of the
 ///         samples, is below the tolerance. A curve that is a point gives true and handles of NaN
+/// @arithmetic
 ZARNMATH_API bool FindBezierOffsetCurve(const point2d* bezier, point2d* offsetBezier, double distance, double tolerance,
                                         double& splitParameter);
 

@@ -25,6 +25,7 @@ namespace ZarnMath {
 /// @param bounds   the box
 /// @param maxLines the budget of segments
 /// @return the share of the budget, truncated; it can be 0, which is no valid count for `BezierToLines`
+/// @arithmetic
 [[nodiscard]] ZARNMATH_API int CalculateNumBezierLines(const RECT& bounds, int maxLines) noexcept;
 
 /// The same for the box of four control points, which for `point2d` is rounded outward.
@@ -32,6 +33,7 @@ namespace ZarnMath {
 /// @param curve    four control points
 /// @param maxLines the budget of segments
 /// @return the share of the budget, truncated; for a curve that is a point, the smallest share
+/// @arithmetic
 [[nodiscard]] ZARNMATH_API int CalculateNumBezierLines(const POINT* curve, int maxLines) noexcept;
 [[nodiscard]] ZARNMATH_API int CalculateNumBezierLines(const point2d* curve, int maxLines) noexcept;
 
@@ -41,6 +43,7 @@ namespace ZarnMath {
 /// @param curve    four control points
 /// @param[out] out lines + 1 points
 /// @param lines    number of segments, not negative. 1 stores the two ends; 0 stores P3 alone
+/// @arithmetic
 ZARNMATH_API void BezierToLines(const POINT* curve, POINT* out, int lines) noexcept;
 ZARNMATH_API void BezierToLines(const point2d* curve, point2d* out, int lines) noexcept;
 
@@ -57,6 +60,7 @@ ZARNMATH_API void BezierToLines(const point2d* curve, point2d* out, int lines) n
 /// @param tolerance the *square* of a distance in drawing units. 0 subdivides to the depth that maxLines allows
 /// @param maxLines  the most segments wanted; above 2047 it counts as 2047
 /// @return n, the number of segments: 0 with nothing stored for maxLines < 1, 1 for maxLines = 1, otherwise even
+/// @arithmetic
 ZARNMATH_API int AdaptiveBezierToLines(const POINT* curve, POINT* out, double tolerance, int maxLines) noexcept;
 ZARNMATH_API int AdaptiveBezierToLines(const point2d* curve, point2d* out, double tolerance, int maxLines) noexcept;
 

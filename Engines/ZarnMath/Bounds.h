@@ -25,17 +25,20 @@ namespace ZarnMath {
 /// @{
 
 /// The empty rectangle: left 2147483647, top -2147483648, right -2147483648, bottom 2147483647.
+/// @arithmetic
 [[nodiscard]] ZARNMATH_API RECT GetEmptyRect() noexcept;
 
 /// Makes a box empty.
 ///
 /// @param[out] box the empty rectangle, or the empty bounds: the same integer limits, as doubles
+/// @arithmetic
 ZARNMATH_API void InitializeEmpty(RECT& box) noexcept;
 ZARNMATH_API void InitializeEmpty(BoundsT<double>& box) noexcept;
 
 /// Swaps left and right, and top and bottom, where they are out of order.
 ///
 /// @param[in,out] rect the rectangle; the empty one becomes the largest possible one
+/// @arithmetic
 ZARNMATH_API void NormalizeRect(RECT& rect) noexcept;
 
 /// @}
@@ -50,6 +53,7 @@ ZARNMATH_API void NormalizeRect(RECT& rect) noexcept;
 /// @param points the points; null gives the empty box
 /// @param count  their number; below 1 gives the empty box
 /// @return the box
+/// @arithmetic
 [[nodiscard]] ZARNMATH_API RECT GetPointsBBox(const POINT* points, int count) noexcept;
 [[nodiscard]] ZARNMATH_API BoundsT<double> GetPointsBBox(const point2d* points, int count) noexcept;
 
@@ -58,12 +62,14 @@ ZARNMATH_API void NormalizeRect(RECT& rect) noexcept;
 /// @param points   the points; null gives the empty rectangle
 /// @param count    their number; below 1 gives the empty rectangle
 /// @param[out] out the rectangle
+/// @arithmetic
 ZARNMATH_API void GetPointsBBox(const POINT* points, int count, RECT& out) noexcept;
 
 /// Widens a rectangle so that it holds a point.
 ///
 /// @param[in,out] rect the rectangle; if it is empty, it becomes the point
 /// @param p            the point
+/// @arithmetic
 ZARNMATH_API void UnionPointWithRect(RECT& rect, const POINT& p) noexcept;
 
 /// Widens a rectangle so that it encloses a point between whole units.
@@ -73,6 +79,7 @@ ZARNMATH_API void UnionPointWithRect(RECT& rect, const POINT& p) noexcept;
 ///
 /// @param[in,out] rect the rectangle
 /// @param p            the point; a NaN coordinate sets nothing
+/// @arithmetic
 ZARNMATH_API void UnionPointWithRect(RECT& rect, const point2d& p) noexcept;
 
 /// Widens a rectangle so that it holds all points.
@@ -80,6 +87,7 @@ ZARNMATH_API void UnionPointWithRect(RECT& rect, const point2d& p) noexcept;
 /// @param[in,out] rect the rectangle
 /// @param points       the points; null is accepted only with a count below 1
 /// @param count        their number; below 1 changes nothing
+/// @arithmetic
 ZARNMATH_API void UnionPointsWithRect(RECT& rect, const POINT* points, int count) noexcept;
 
 /// @}
@@ -94,6 +102,7 @@ ZARNMATH_API void UnionPointsWithRect(RECT& rect, const POINT* points, int count
 /// @param[in,out] a the union
 /// @param b         the other rectangle
 /// @return whether the union is strictly non-empty
+/// @arithmetic
 ZARNMATH_API bool UnionRect(RECT& a, const RECT& b) noexcept;
 
 /// Narrows a rectangle to what it shares with another one.
@@ -102,6 +111,7 @@ ZARNMATH_API bool UnionRect(RECT& a, const RECT& b) noexcept;
 ///                  share no more than an edge, it is left as it comes out, inside out or of zero size
 /// @param b         the other rectangle
 /// @return whether the intersection is strictly non-empty
+/// @arithmetic
 ZARNMATH_API bool IntersectRect(RECT& a, const RECT& b) noexcept;
 
 /// @}
@@ -112,6 +122,7 @@ ZARNMATH_API bool IntersectRect(RECT& a, const RECT& b) noexcept;
 ///
 /// @param[in,out] rect the rectangle
 /// @param dx, dy       the displacement
+/// @arithmetic
 ZARNMATH_API void TranslateRect(RECT& rect, int dx, int dy) noexcept;
 
 /// Moves a rectangle with left <= right and bottom <= top, one of zero size included, and leaves every other one as it
@@ -119,6 +130,7 @@ ZARNMATH_API void TranslateRect(RECT& rect, int dx, int dy) noexcept;
 ///
 /// @param[in,out] rect the rectangle
 /// @param dx, dy       the displacement
+/// @arithmetic
 ZARNMATH_API void TranslateValidRect(RECT& rect, int dx, int dy) noexcept;
 
 /// Moves each edge outward.
@@ -126,6 +138,7 @@ ZARNMATH_API void TranslateValidRect(RECT& rect, int dx, int dy) noexcept;
 /// @param[in,out] rect the rectangle; negative amounts may turn it inside out
 /// @param dx           the amount at left and at right
 /// @param dy           the amount at top and at bottom
+/// @arithmetic
 ZARNMATH_API void InflateRect(RECT& rect, int dx, int dy) noexcept;
 
 /// @}
@@ -136,14 +149,17 @@ ZARNMATH_API void InflateRect(RECT& rect, int dx, int dy) noexcept;
 ///
 /// @param box      the box, of any kind
 /// @param[out] out four points
+/// @arithmetic
 ZARNMATH_API void GetRectCorners(const BoundsT<double>& box, point2d* out) noexcept;
 ZARNMATH_API void GetRectCorners(const RECT& box, POINT* out) noexcept;
 
 /// The centre of `rect` in whole units, each coordinate truncated toward zero. A sum of two fields wraps in 32 bits.
+/// @arithmetic
 [[nodiscard]] ZARNMATH_API POINT GetRectCenter(const RECT& rect) noexcept;
 
 /// Height times width of `rect` in drawing units squared, made positive: inside out counts as well. Heights and widths
 /// wrap in 32 bits.
+/// @arithmetic
 [[nodiscard]] ZARNMATH_API double GetRectArea(const RECT& rect) noexcept;
 
 /// @}
@@ -158,6 +174,7 @@ ZARNMATH_API void GetRectCorners(const RECT& box, POINT* out) noexcept;
 /// @param p    the point; NaN lies nowhere
 /// @param rect the rectangle; nothing lies in the empty one
 /// @return whether it does
+/// @arithmetic
 [[nodiscard]] ZARNMATH_API bool IsPointInRect(const POINT& p, const RECT& rect) noexcept;
 [[nodiscard]] ZARNMATH_API bool IsPointInRect(const point2d& p, const RECT& rect) noexcept;
 
@@ -167,6 +184,7 @@ ZARNMATH_API void GetRectCorners(const RECT& box, POINT* out) noexcept;
 /// @param count  their number; 0 gives false
 /// @param rect   the rectangle
 /// @return whether one does
+/// @arithmetic
 [[nodiscard]] ZARNMATH_API bool IsAnyPointInRect(const POINT* points, unsigned long count, const RECT& rect) noexcept;
 
 /// The rectangle about a point. Its sides wrap in 32 bits, and a negative half extent turns it inside out.
@@ -174,6 +192,7 @@ ZARNMATH_API void GetRectCorners(const RECT& box, POINT* out) noexcept;
 /// @param p      the centre
 /// @param r      half the width and half the height, in drawing units
 /// @return left p.x - r, top p.y + r, right p.x + r, bottom p.y - r
+/// @arithmetic
 [[nodiscard]] ZARNMATH_API RECT GetPointRect(const POINT& p, int r) noexcept;
 
 /// The rectangle about a point, with half extents of its own for each axis.
@@ -181,9 +200,11 @@ ZARNMATH_API void GetRectCorners(const RECT& box, POINT* out) noexcept;
 /// @param p      the centre
 /// @param rx, ry half the width, half the height, in drawing units
 /// @return left p.x - rx, top p.y + ry, right p.x + rx, bottom p.y - ry
+/// @arithmetic
 [[nodiscard]] ZARNMATH_API RECT GetPointRect(const POINT& p, int rx, int ry) noexcept;
 
 /// The unit square: left 0, top 1, right 1, bottom 0. The reference stays valid, and may be asked for from any thread.
+/// @arithmetic
 [[nodiscard]] ZARNMATH_API const BoundsT<double>& IdentityBounds() noexcept;
 
 /// @}
@@ -198,6 +219,7 @@ ZARNMATH_API void GetRectCorners(const RECT& box, POINT* out) noexcept;
 /// @param box the box; an empty one is transformed like any other, and is not marked as empty afterwards
 /// @param m   the transform
 /// @return the box. As a `RECT` it may fall short of the exact one by half a unit
+/// @arithmetic
 [[nodiscard]] ZARNMATH_API RECT GetTransformedBBox(const RECT& box, const MATRIX& m) noexcept;
 [[nodiscard]] ZARNMATH_API BoundsT<double> GetTransformedBBox(const BoundsT<double>& box, const MATRIX& m) noexcept;
 
@@ -206,6 +228,7 @@ ZARNMATH_API void GetRectCorners(const RECT& box, POINT* out) noexcept;
 /// @param box the box
 /// @param m   the transform, which stays as it is
 /// @return the box; all zeros where the determinant is at most DBL_EPSILON in magnitude, or NaN
+/// @arithmetic
 [[nodiscard]] ZARNMATH_API RECT GetUntransformedBBox(const RECT& box, const MATRIX& m) noexcept;
 [[nodiscard]] ZARNMATH_API BoundsT<double> GetUntransformedBBox(const BoundsT<double>& box, const MATRIX& m) noexcept;
 
@@ -215,6 +238,7 @@ ZARNMATH_API void GetRectCorners(const RECT& box, POINT* out) noexcept;
 /// @param count  their number; 0 gives the empty rectangle
 /// @param m      the transform
 /// @return the rectangle, each side rounded outward
+/// @arithmetic
 [[nodiscard]] ZARNMATH_API RECT GetTransformedPointsBBox(const POINT* points, unsigned long count,
                                                          const MATRIX& m) noexcept;
 
@@ -225,6 +249,7 @@ ZARNMATH_API void GetRectCorners(const RECT& box, POINT* out) noexcept;
 /// @param count  their number; 0 gives the empty bounds
 /// @param m      the transform
 /// @return the bounds; an image with NaN widens nothing
+/// @arithmetic
 [[nodiscard]] ZARNMATH_API BoundsT<double> GetTransformedPointsBBox(const point2d* points, unsigned long count,
                                                                     const MATRIX& m) noexcept;
 
@@ -234,16 +259,17 @@ ZARNMATH_API void GetRectCorners(const RECT& box, POINT* out) noexcept;
 /// @param from its box; a side of 0 gives infinities or NaN
 /// @param to   the other box
 /// @return the image of p under `ConstructRectTransformMatrix(from, to, MapStretch)`
+/// @arithmetic
 [[nodiscard]] ZARNMATH_API point2d GetRemappedPoint(const point2d& p, const BoundsT<double>& from,
                                                     const BoundsT<double>& to) noexcept;
 
-/// The box of the ellipse that a transform makes of a circle (platform class: the last bits are those of the machine's
-/// atan, sin and cos).
+/// The box of the ellipse that a transform makes of a circle. The last bits are those of the machine's atan, sin and cos.
 ///
 /// @param m      the transform; its translation is not used, and a singular one gives the right flat box
 /// @param radius the radius of the circle, in drawing units
 /// @param centre the centre of the *ellipse*: it is not transformed
 /// @return the box, right beyond the limits of the 32-bit integers too
+/// @platform
 [[nodiscard]] ZARNMATH_API BoundsT<double> GetTransformedCircleBBox(const MATRIX& m, double radius,
                                                                     point2d centre) noexcept;
 

@@ -35,6 +35,7 @@ namespace ZarnMath {
 /// @param count  their number. One point has the parameter 1.0; of points that all coincide the inner ones have NaN
 /// @param[out] u resized to count
 /// @throws std::length_error for a count below 1
+/// @arithmetic
 ZARNMATH_API void Calculate_u(const point2d* points, int count, std::vector<double>& u);
 
 /// @name One cubic with given ends and tangents
@@ -59,6 +60,7 @@ ZARNMATH_API void Calculate_u(const point2d* points, int count, std::vector<doub
 ///                     any; may be null
 /// @param threshold    a pass that counts and has an error below it is the last one
 /// @return the error of the curve, a squared distance; the largest double, with nothing written, for fewer than two points
+/// @arithmetic
 ZARNMATH_API double LeastSquares(const point2d* points, double* u, int count, const vector2d& t1, const vector2d& t2,
                                  point2d* bezier, int iterations, double* worst_u, double threshold) noexcept;
 
@@ -71,6 +73,7 @@ ZARNMATH_API double LeastSquares(const point2d* points, double* u, int count, co
 /// @param iterations  the number of passes, at least 1
 /// @return the error of the curve, a squared distance; the largest double, with nothing written, for one point
 /// @throws std::length_error for a count below 1
+/// @arithmetic
 ZARNMATH_API double LeastSquares(const point2d* points, int count, const vector2d& t1, const vector2d& t2,
                                  point2d* bezier, int iterations);
 
@@ -95,6 +98,7 @@ ZARNMATH_API double LeastSquares(const point2d* points, int count, const vector2
 ///                       any; may be null
 /// @return the error of the curve, a squared distance; the largest double, with nothing written, for fewer than two
 ///         points, and where there is no pass
+/// @arithmetic
 ZARNMATH_API double LeastSquares(const point2d* points, double* u, int count, point2d* bezier, int iterations,
                                  double* worst_u) noexcept;
 
@@ -107,6 +111,7 @@ ZARNMATH_API double LeastSquares(const point2d* points, double* u, int count, po
 /// @return the error of the curve, a squared distance; the largest double, with nothing written, for one point, and where
 ///         there is no pass
 /// @throws std::length_error for a count below 1
+/// @arithmetic
 ZARNMATH_API double LeastSquares(const point2d* points, int count, point2d* bezier, int iterations);
 
 /// @}
@@ -133,6 +138,7 @@ ZARNMATH_API double LeastSquares(const point2d* points, int count, point2d* bezi
 /// @return the larger error of the two curves, both measured against the box of all points; the largest double, with
 ///         nothing written, for fewer than five points, and where there is no pass
 /// @throws std::length_error where split is negative or above n
+/// @arithmetic
 ZARNMATH_API double LeastSquares(const point2d* points, double* u, int n, int split, const vector2d& t1,
                                  const vector2d& t2, point2d* a, point2d* b, int iterations);
 
@@ -148,6 +154,7 @@ ZARNMATH_API double LeastSquares(const point2d* points, double* u, int n, int sp
 /// @return the larger error of the two curves; the largest double, with nothing written, for fewer than five points, and
 ///         where there is no pass
 /// @throws std::length_error for n below 1, and where split is negative or above n
+/// @arithmetic
 ZARNMATH_API double LeastSquares(const point2d* points, int n, int split, const vector2d& t1, const vector2d& t2,
                                  point2d* a, point2d* b, int iterations);
 
@@ -160,6 +167,7 @@ ZARNMATH_API double LeastSquares(const point2d* points, int n, int split, const 
 /// @param[in,out] coefficients c0, c1 and c2 are appended, in this order
 /// @return false, with nothing appended, for fewer than three points, and where the normal equations come out as exactly
 ///         singular, as for fewer than three different x
+/// @arithmetic
 ZARNMATH_API bool LeastSquares(const point2d* points, unsigned long count, std::vector<double>& coefficients);
 
 } // namespace ZarnMath

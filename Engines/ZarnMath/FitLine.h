@@ -23,6 +23,7 @@ namespace ZarnMath {
 /// @param count          their number; below 2 leaves both results untouched
 /// @param[out] point     a point of the line
 /// @param[out] direction the direction of the line
+/// @arithmetic
 ZARNMATH_API void GetLeastSquaresLines(const point2d* points, int count, point2d& point, vector2d& direction) noexcept;
 
 /// Fits a line to points whose sums are known.
@@ -33,6 +34,7 @@ ZARNMATH_API void GetLeastSquaresLines(const point2d* points, int count, point2d
 /// @param count               their number; 0 gives NaN
 /// @param[out] point          a point of the line
 /// @param[out] direction      the direction of the line; both as in the form that takes the points alone
+/// @arithmetic
 ZARNMATH_API void GetLeastSquaresLines(double sumX, double sumY, double sumXY, double sumXX, double sumYY,
                                        const point2d* points, int count, point2d& point, vector2d& direction) noexcept;
 

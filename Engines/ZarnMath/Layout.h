@@ -66,6 +66,7 @@ struct Layout
 /// @param frame  the frame, of any kind
 /// @param layout the description
 /// @return the rectangle; the frame itself if nothing is given
+/// @arithmetic
 [[nodiscard]] ZARNMATH_API BoundsT<double> LayoutObject(BoundsT<double> frame, const Layout& layout) noexcept;
 
 /// The transform that takes an object onto the rectangle that `LayoutObject` gives it: a scale, and then a move.
@@ -74,6 +75,7 @@ struct Layout
 /// @param object the object's own bounds; where they have no width or height, the scale is infinite or NaN
 /// @param layout the description
 /// @return the matrix; left and bottom of the object land on left and bottom of the rectangle
+/// @arithmetic
 [[nodiscard]] ZARNMATH_API MATRIX GetLayoutTransformation(const BoundsT<double>& frame, const BoundsT<double>& object,
                                                           const Layout& layout) noexcept;
 

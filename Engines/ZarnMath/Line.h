@@ -17,6 +17,7 @@ namespace ZarnMath {
 ///                  points on the line. The `POINT` overload compares in double
 /// @return whether no point is farther away. Horizontal points can fail where a sum is rounded: the fit then has a mixed
 ///         moment that is not quite zero, and so a huge direction
+/// @arithmetic
 [[nodiscard]] ZARNMATH_API bool AreCollinear(const point2d* points, unsigned long count, double tolerance) noexcept;
 [[nodiscard]] ZARNMATH_API bool AreCollinear(const POINT* points, unsigned long count, double tolerance);
 
@@ -25,6 +26,7 @@ namespace ZarnMath {
 /// @param start, end the segment; of zero length it counts as a point
 /// @param p          the point
 /// @return the squared distance
+/// @arithmetic
 [[nodiscard]] ZARNMATH_API double DistanceToLineSegmentSqrd(const point2d& start, const point2d& end,
                                                             const point2d& p) noexcept;
 
@@ -38,6 +40,7 @@ namespace ZarnMath {
 /// @param c, d  the second segment
 /// @param width the distance in drawing units; to be exactly at it is not closer
 /// @return whether they do
+/// @arithmetic
 [[nodiscard]] ZARNMATH_API bool DoesFatlineIntersectLine(const point2d& a, const point2d& b, const point2d& c,
                                                          const point2d& d, double width) noexcept;
 
@@ -49,6 +52,7 @@ namespace ZarnMath {
 /// @param origin         a point of the line
 /// @param[in,out] points the points; null is left alone
 /// @param count          their number
+/// @arithmetic
 ZARNMATH_API void ReflectAcross(POINT direction, POINT origin, POINT* points, unsigned long count) noexcept;
 
 } // namespace ZarnMath

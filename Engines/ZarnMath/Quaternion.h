@@ -22,26 +22,31 @@ struct Quaternion
 
     /// The Hamilton product: as a rotation, the right operand `other` acts first. Of unit quaternions it is one, but for
     /// rounding; any others have a product too.
+    /// @arithmetic
     [[nodiscard]] ZARNMATH_API Quaternion operator*(const Quaternion& other) const noexcept;
 
     /// Multiplies by a vector from one side only: the vector part of q * v. This is no rotation by q, but for q = 1.
     ///
     /// @param[in,out] v the vector; any will do
+    /// @arithmetic
     ZARNMATH_API void RotateQuick(vector3dT<double>& v) const noexcept;
 
     /// Rotates a vector: q * v * conjugate(q).
     ///
     /// @param[in,out] v the vector; multiplied by the squared length of this quaternion, which should be 1. The zero
     ///                  quaternion makes it zero
+    /// @arithmetic
     ZARNMATH_API void Rotate(vector3dT<double>& v) const noexcept;
 
     /// Becomes (a x b, a . b): for unit vectors the rotation by twice the angle from a to b.
     ///
     /// @param a, b the vectors; parallel ones give (0, 0, 0, a . b)
+    /// @arithmetic
     ZARNMATH_API void RotationCreate(const vector3dT<double>& a, const vector3dT<double>& b) noexcept;
 
     /// Sets components that are nearly 0 to 0: x, y, z of at most 1000 * `DBL_EPSILON` in absolute value, and w of at
     /// most `DBL_EPSILON`.
+    /// @arithmetic
     ZARNMATH_API void ForceZeros() noexcept;
 
     /// Spherical linear interpolation between unit quaternions (K. Shoemake, 1985). Opposite ones are not flipped to the
@@ -52,6 +57,7 @@ struct Quaternion
     /// @param[out] out the quaternion in between; may be one of the ends
     /// @return false if a and b are too close to equal or to opposite, 1 - |a . b| < 1e-08: out is written, and is a,
     ///         which serves as the result
+    /// @platform
     ZARNMATH_API static bool Interpolate(const Quaternion& a, const Quaternion& b, double t, Quaternion& out) noexcept;
 
     friend constexpr bool operator==(const Quaternion&, const Quaternion&) noexcept = default;

@@ -17,6 +17,7 @@ struct Random
     ///
     /// @param low, high the ends, in any order and also equal
     /// @return a number from low to high. High itself is reachable: 64 random bits are rounded to the 53 of a double
+    /// @arithmetic
     ZARNMATH_API static double Generate(double low, double high);
 
     /// An integer from a range, each equally likely. Consumes one output, and as many more as it takes to land in the
@@ -25,6 +26,7 @@ struct Random
     /// @param low  the smallest
     /// @param high the largest, included; below low there is no meaningful result
     /// @return the integer
+    /// @arithmetic
     ZARNMATH_API static int Generate(int low, int high);
 };
 

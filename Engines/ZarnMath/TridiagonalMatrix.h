@@ -34,6 +34,7 @@ public:
     /// @param b coefficient of the row's own unknown
     /// @param c coefficient of the unknown after; in the last row of a plain system ignored, of a cyclic one that of the
     ///          first. The two cyclic rules hold for two rows too, where both side coefficients meet one unknown
+    /// @arithmetic
     ZARNMATH_API void AddRow(double a, double b, double c);
 
     /// Solves for a right-hand side of numbers, or of points, whose coordinates are solved for side by side.
@@ -43,6 +44,7 @@ public:
     /// @param rhs    as many elements as there are rows: at least one, or two for a cyclic system
     /// @param cyclic whether the first and the last row wrap round to each other
     /// @return the unknowns
+    /// @arithmetic
     [[nodiscard]] ZARNMATH_API std::vector<double> Solve(const std::vector<double>& rhs, bool cyclic) const;
     [[nodiscard]] ZARNMATH_API std::vector<point2d> Solve(const std::vector<point2d>& rhs, bool cyclic) const;
 

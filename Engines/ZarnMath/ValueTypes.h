@@ -26,7 +26,15 @@
 #include <limits>
 #include <type_traits>
 
+#ifdef __FAST_MATH__
+#error "Options that relax IEEE 754, such as -ffast-math, change results."
+#endif
+
 namespace ZarnMath {
+
+static_assert(std::numeric_limits<double>::is_iec559 && std::numeric_limits<float>::is_iec559);
+static_assert(FLT_EVAL_METHOD == 0, "A processor that computes with more digits rounds twice: 32-bit x86 needs "
+                                    "-msse2 -mfpmath=sse.");
 
 using Framework::common_types::POINT;
 using Framework::common_types::RECT;

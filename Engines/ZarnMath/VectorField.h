@@ -54,9 +54,11 @@ struct VectorField
     }
 
     /// Takes over the rows of `other` and copies its four integers; it is left without rows.
+    /// @arithmetic
     ZARNMATH_API VectorField(VectorField&& other) noexcept;
 
     /// The same; the rows that stood here are released, whether or not `other` has any.
+    /// @arithmetic
     ZARNMATH_API VectorField& operator=(VectorField&& other) noexcept;
 
     /// @name Bounds
@@ -67,15 +69,18 @@ struct VectorField
     /// @param columns, lines the size; if either is below 1 the field becomes the empty one, and its row storage is
     ///                       released
     /// @param x, y           the origin
+    /// @arithmetic
     ZARNMATH_API void Initialize(int columns, int lines, int x, int y);
 
     /// The same from an inclusive rectangle.
     ///
     /// @param rect the bounds; inside out in either direction, it makes the field empty. A size beyond 2147483647
     ///             counts as that
+    /// @arithmetic
     ZARNMATH_API void Initialize(const RECT& rect);
 
     /// Empties every row and keeps its storage. Bounds stay; an empty field stays empty.
+    /// @arithmetic
     ZARNMATH_API void ClearVectors() noexcept;
 
     /// Sets new bounds and keeps the content that lies inside them, in place in the plane. If an exception comes out,
@@ -83,6 +88,7 @@ struct VectorField
     ///
     /// @param rect the new bounds, as for `Initialize`; inside out, they make the field empty
     /// @return whether all of the old bounds lay inside rect; also true where the old field had no columns
+    /// @arithmetic
     ZARNMATH_API bool Rebound(const RECT& rect);
 
     /// Grows the bounds to what `UnionRect` makes of them and a rectangle. That counts bounds one cell wide or high as
@@ -90,9 +96,11 @@ struct VectorField
     ///
     /// @param rect what the bounds are to hold
     /// @return whether the bounds changed
+    /// @arithmetic
     ZARNMATH_API bool Extend(const RECT& rect);
 
     /// The bounds, inclusive: of the empty field left 0, top -1, right -1, bottom 0.
+    /// @arithmetic
     [[nodiscard]] ZARNMATH_API RECT GetZGIRECT() const noexcept;
 
     /// @}
@@ -106,6 +114,7 @@ struct VectorField
     /// @param source the field to copy
     /// @param dx, dy the offset
     /// @return whether it fitted whole; true for a source without columns
+    /// @arithmetic
     ZARNMATH_API bool Blit(const VectorField& source, int dx, int dy);
 
     /// Grows the bounds as by `Extend` to hold the moved source, and copies it in. An empty source leaves bounds of two
@@ -114,12 +123,14 @@ struct VectorField
     /// @param source the field to copy
     /// @param dx, dy the offset
     /// @return whether the bounds changed
+    /// @arithmetic
     ZARNMATH_API bool BlitExtend(const VectorField& source, int dx, int dy);
 
     /// A new field with what this one holds inside a rectangle.
     ///
     /// @param rect the rectangle, inclusive
     /// @return the overlap; the empty field where it is less than two cells wide or high. This field stays as it is
+    /// @arithmetic
     [[nodiscard]] ZARNMATH_API VectorField GetRegion(const RECT& rect);
 
     /// @}
@@ -133,6 +144,7 @@ struct VectorField
     ///
     /// @param position in the plane; with a height of at least 2. With a width of 1 the zero vector comes out
     /// @return the vector. No allocation, no division, four reads
+    /// @arithmetic
     [[nodiscard]] ZARNMATH_API vector2dT<float, false> Get(vector2dT<float, true> position) const noexcept;
 
     /// Writes one cell.

@@ -42,12 +42,14 @@ extern "C" {
 /// The identity, whatever stood in the matrix.
 ///
 /// @param[out] out 65536 on the diagonal, 0 elsewhere
+/// @arithmetic
 ZARNMATH_API void MTHGet3DIdentityMatrix(MATRIX3D* out) noexcept;
 
 /// Adds a translation after what the matrix does, whatever that is. Sums wrap in 32 bits.
 ///
 /// @param[in,out] m the matrix, of which column 3 changes
 /// @param x, y, z   the translation
+/// @arithmetic
 ZARNMATH_API void MTHTranslate3DMatrix(MATRIX3D* m, int x, int y, int z) noexcept;
 
 /// Transforms points in place, in single precision: coordinates above 2^24 lose their low bits on the way in. The image
@@ -56,6 +58,7 @@ ZARNMATH_API void MTHTranslate3DMatrix(MATRIX3D* m, int x, int y, int z) noexcep
 /// @param[in,out] points the points
 /// @param m              the matrix
 /// @param count          their number; below 1 nothing happens
+/// @arithmetic
 ZARNMATH_API void MTHTransform3DPoints(POINT3D* points, const MATRIX3D* m, int count) noexcept;
 
 /// Projects points from a viewpoint onto the plane z = 0, in double precision, truncated at the end.
@@ -65,6 +68,7 @@ ZARNMATH_API void MTHTransform3DPoints(POINT3D* points, const MATRIX3D* m, int c
 /// @param count     their number; below 1 nothing happens
 /// @param viewpoint where the eye is
 /// @return always 1
+/// @arithmetic
 ZARNMATH_API int MTHPerspective3DProjection(const POINT3D* points, Framework::common_types::POINT* out, int count,
                                             const POINT3D* viewpoint) noexcept;
 
@@ -73,6 +77,7 @@ ZARNMATH_API int MTHPerspective3DProjection(const POINT3D* points, Framework::co
 ///
 /// @param q        the quaternion
 /// @param[out] out the matrix, without translation; each product is truncated to fixed point and then doubled
+/// @arithmetic
 ZARNMATH_API void VECT_QuaternionToMat(const ZarnMath::Quaternion* q, MATRIX3D* out) noexcept;
 
 /// The unit quaternion of a fixed-point rotation, the inverse of `VECT_QuaternionToMat`. The elements are read in single
@@ -82,6 +87,7 @@ ZARNMATH_API void VECT_QuaternionToMat(const ZarnMath::Quaternion* q, MATRIX3D* 
 /// @param[out] out the quaternion. Its w is positive where the trace of the rotation is above 0; otherwise the component
 ///                 of the largest diagonal element is (a rotation has one above -1/3), and a matrix that is no rotation
 ///                 may give NaN
+/// @arithmetic
 ZARNMATH_API void VECT_MatToQuaternion(const MATRIX3D* m, ZarnMath::Quaternion* out) noexcept;
 
 } // extern "C"

@@ -1,6 +1,10 @@
 /// @file
 /// The whole library.
 ///
+/// The last line of each function's description names its class. What is *arithmetic* computes with + - * /, sqrt, fmod,
+/// ceil, floor, fabs and integers alone, and gives the same bits on every machine. What is *platform* goes through other
+/// mathematical functions of the C library, and has that library's last bits.
+///
 /// @namespace ZarnMath
 /// Everything but the matrices and the plain-C families, which stand in the global namespace.
 ///

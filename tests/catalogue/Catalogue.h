@@ -82,8 +82,7 @@ public:
     template <typename Signature, typename Body>
     void AddWith(const char* name, std::type_identity_t<Signature>* function, Body body)
     {
-        AddBody(name + Parameters<Signature>::Name(),
-                [function, body](Source& in, Sink& out) { body(function, in, out); });
+        AddBody(NameOf<Signature>(name), [function, body](Source& in, Sink& out) { body(function, in, out); });
     }
 
     /// What has no address, or calls several functions.
@@ -100,6 +99,13 @@ public:
     }
 
 private:
+    template <typename Signature>
+    static std::string NameOf(std::string name)
+    {
+        Parameters<Signature>::AppendTo(name);
+        return name;
+    }
+
     template <typename Body>
     class CallOf final : public Call
     {
@@ -152,7 +158,7 @@ private:
     template <typename Signature, typename Callee, typename... Draws>
     void AddDrawn(const char* name, Callee callee, Draws... draws)
     {
-        AddBody(name + Parameters<Signature>::Name(), [=](Source& in, Sink& out) {
+        AddBody(NameOf<Signature>(name), [=](Source& in, Sink& out) {
             [[maybe_unused]] Draft draft{in};
             Invocation<Callee>{callee, out, draws(draft)...};
         });

@@ -71,54 +71,49 @@ constexpr bool isVector<std::vector<T>> = true;
 
 /// `const point2d*` and the like: qualifiers in front, what points behind.
 template <typename T>
-std::string NameOfType()
+void AppendNameOfType(std::string& name)
 {
-    if constexpr (std::is_lvalue_reference_v<T>)
-        return NameOfType<std::remove_reference_t<T>>() + "&";
-    else if constexpr (std::is_pointer_v<T>)
-        return NameOfType<std::remove_pointer_t<T>>() + "*";
-    else if constexpr (std::is_const_v<T>)
-        return "const " + NameOfType<std::remove_const_t<T>>();
-    else if constexpr (isVector<T>)
-        return "vector<" + NameOfType<typename T::value_type>() + ">";
-    else
-        return plainName<T>;
-}
-
-template <typename First, typename... Others>
-std::string NamesOfTypes()
-{
-    return (NameOfType<First>() + ... + (", " + NameOfType<Others>()));
+    if constexpr (std::is_lvalue_reference_v<T>) {
+        AppendNameOfType<std::remove_reference_t<T>>(name);
+        name += '&';
+    } else if constexpr (std::is_pointer_v<T>) {
+        AppendNameOfType<std::remove_pointer_t<T>>(name);
+        name += '*';
+    } else if constexpr (std::is_const_v<T>) {
+        name += "const ";
+        AppendNameOfType<std::remove_const_t<T>>(name);
+    } else if constexpr (isVector<T>) {
+        name += "vector<";
+        AppendNameOfType<typename T::value_type>(name);
+        name += '>';
+    } else {
+        name += plainName<T>;
+    }
 }
 
 /// The parameters of a function type in their parentheses, and `const` where it stands behind them.
 template <typename Signature>
 struct Parameters;
 
-template <typename Result>
-struct Parameters<Result()>
-{
-    static std::string Name()
-    {
-        return "()";
-    }
-};
-
 template <typename Result, typename... Types>
 struct Parameters<Result(Types...)>
 {
-    static std::string Name()
+    static void AppendTo(std::string& name)
     {
-        return "(" + NamesOfTypes<Types...>() + ")";
+        name += '(';
+        [[maybe_unused]] const char* separator = "";
+        ((name += separator, separator = ", ", AppendNameOfType<Types>(name)), ...);
+        name += ')';
     }
 };
 
 template <typename Result, typename... Types>
 struct Parameters<Result(Types...) const>
 {
-    static std::string Name()
+    static void AppendTo(std::string& name)
     {
-        return Parameters<Result(Types...)>::Name() + " const";
+        Parameters<Result(Types...)>::AppendTo(name);
+        name += " const";
     }
 };
 

@@ -7,7 +7,7 @@ namespace {
 
 using Point = const point2d&;
 using Vector = const vector2d&;
-using Box = const BoundsT<double>&;
+using Bounded = const BoundsT<double>&;
 using Matrix = const MATRIX&;
 
 constexpr auto parts = [](Draft& draft) {
@@ -117,7 +117,7 @@ void AddDecomposition(Family& family)
     family.Set(NumberClass::Arithmetic);
 }
 
-void AddConstruction(Family& family)
+void AddConstructors(Family& family)
 {
     family.Add<MATRIX()>("IdentityMatrix", IdentityMatrix);
     family.Add<MATRIX()>("SwapXYMatrix", SwapXYMatrix);
@@ -127,9 +127,9 @@ void AddConstruction(Family& family)
                                               point<>);
     family.Add<MATRIX(Matrix, Point)>("ConstructTransformAroundMatrix", ConstructTransformAroundMatrix, matrix,
                                       point<>);
-    family.Add<MATRIX(Box, bool)>("ConstructBBoxScaleMatrix", ConstructBBoxScaleMatrix, bounds, flag);
-    family.Add<MATRIX(Box, Box, MapMode)>("ConstructRectTransformMatrix", ConstructRectTransformMatrix, bounds, bounds,
-                                          mode);
+    family.Add<MATRIX(Bounded, bool)>("ConstructBBoxScaleMatrix", ConstructBBoxScaleMatrix, bounds, flag);
+    family.Add<MATRIX(Bounded, Bounded, MapMode)>("ConstructRectTransformMatrix", ConstructRectTransformMatrix, bounds,
+                                                  bounds, mode);
     family.Add<vector2d(Vector, Vector, MapMode)>("GetScaleForSizeTransform", GetScaleForSizeTransform, vector, vector,
                                                   mode);
     family.Add<void(point2d*, unsigned long, Point)>("TranslatePoints", TranslatePoints, changedPoints<point2d>,
@@ -159,7 +159,7 @@ void AddWMath(std::vector<Function>& list)
     AddClassification(family);
     AddPlainC(family);
     AddDecomposition(family);
-    AddConstruction(family);
+    AddConstructors(family);
 }
 
 } // namespace ZarnMath::Catalogue
