@@ -5,6 +5,8 @@
 #include "tests/degenerate/Sources.h"
 
 #include <algorithm>
+#include <cstdio>
+#include <set>
 
 namespace ZarnMath::Degenerate {
 
@@ -129,10 +131,10 @@ std::string NamePlaces(const std::vector<std::string>& places)
 std::vector<Finding> FindingsOf(const Function& function, const Special& value, const std::string& ordinary)
 {
     std::vector<Finding> findings;
-    SpecialSource counting(true, value, -1);
+    SpecialSource counting(value, -1);
     Answer(function, counting, Detail::Classes);
     for (std::size_t place = 0; place < counting.Names().size(); ++place) {
-        SpecialSource source(true, value, static_cast<int>(place));
+        SpecialSource source(value, static_cast<int>(place));
         const std::string answer = Answer(function, source, Detail::Classes);
         if (answer == ordinary)
             continue;
@@ -160,7 +162,7 @@ void Merge(std::vector<Finding>& all, const std::vector<Finding>& some)
 
 std::string SpecialTable(const Function& function)
 {
-    SpecialSource ordinarySource(true, specials.front(), -1);
+    SpecialSource ordinarySource(specials.front(), -1);
     const std::string ordinary = Answer(function, ordinarySource, Detail::Classes);
     std::vector<Finding> findings;
     for (const Special& value : specials)
@@ -173,7 +175,82 @@ std::string SpecialTable(const Function& function)
 
 /// @}
 
+/// @name Both at once
+/// @{
+
+/// The checksum of Adler, on text (M. Adler, 1995).
+class Checksum
+{
+public:
+    void Add(const std::string& text) noexcept
+    {
+        constexpr std::uint32_t largestPrime = 65521;
+        for (const char c : text) {
+            low = (low + static_cast<unsigned char>(c)) % largestPrime;
+            high = (high + low) % largestPrime;
+        }
+    }
+
+    [[nodiscard]] std::uint32_t Value() const noexcept
+    {
+        return high << 16 | low;
+    }
+
+private:
+    std::uint32_t low = 1;
+    std::uint32_t high = 0;
+};
+
+/// Calls answer(text) for each special value in each place, with one partition.
+template <typename Take>
+void CrossOne(const Function& function, const Partition& partition, int whose, bool flags, Take take)
+{
+    for (const Special& value : specials) {
+        SpecialSource counting(value, -1, partition, whose, flags);
+        take(Answer(function, counting, Detail::Classes));
+        for (std::size_t place = 0; place < counting.Names().size(); ++place) {
+            SpecialSource source(value, static_cast<int>(place), partition, whose, flags);
+            take(Answer(function, source, Detail::Classes));
+        }
+    }
+}
+
+/// What depends on the machine's mathematical functions may end on either side of a limit, and is only called.
+std::string CrossingLine(const Function& function)
+{
+    const Crossing crossing = CrossAll(function);
+    if (function.numberClass == Catalogue::NumberClass::Platform)
+        return "";
+    char line[120];
+    std::snprintf(line, sizeof line, "\nBoth at once: %ld calls, %ld answers, %08lx.\n", crossing.calls,
+                  crossing.answers, static_cast<unsigned long>(crossing.checksum));
+    return line;
+}
+
+/// @}
+
 } // namespace
+
+Crossing CrossAll(const Function& function)
+{
+    Crossing crossing{};
+    Checksum checksum;
+    std::set<std::string> answers;
+    const auto take = [&](const std::string& answer) {
+        ++crossing.calls;
+        checksum.Add(answer + "\n");
+        answers.insert(answer);
+    };
+    const int curves = CountCurves(function);
+    for (const bool flags : {false, true})
+        for (int whose = 0; whose < std::max(curves, 1); ++whose)
+            for (const Partition& partition : partitions)
+                if (curves > 0 || partition == distinctPoints)
+                    CrossOne(function, partition, whose, flags, take);
+    crossing.answers = static_cast<long>(answers.size());
+    crossing.checksum = checksum.Value();
+    return crossing;
+}
 
 std::string SectionOn(const Function& function)
 {
@@ -181,21 +258,7 @@ std::string SectionOn(const Function& function)
     const int curves = CountCurves(function);
     for (int whose = 0; whose < curves; ++whose)
         section += CoincidenceTable(function, whose, curves);
-    return section + SpecialTable(function);
-}
-
-void CallWithSpecials(const Function& function)
-{
-    for (const bool flags : {false, true}) {
-        for (const Special& value : specials) {
-            SpecialSource counting(flags, value, -1);
-            Answer(function, counting, Detail::Classes);
-            for (std::size_t place = 0; place < counting.Names().size(); ++place) {
-                SpecialSource source(flags, value, static_cast<int>(place));
-                Answer(function, source, Detail::Classes);
-            }
-        }
-    }
+    return section + SpecialTable(function) + CrossingLine(function);
 }
 
 } // namespace ZarnMath::Degenerate

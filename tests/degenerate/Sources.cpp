@@ -103,28 +103,32 @@ vector2d SpecialSource::Vector()
     return vector;
 }
 
+CurveOf<point2d> SpecialSource::UnreplacedCubic()
+{
+    CurveOf<point2d> curve;
+    std::ranges::transform(CoincidentSource::IntegerCubic(), curve.begin(), [](const POINT& p) {
+        return point2d{double(p.x), double(p.y)};
+    });
+    return curve;
+}
+
 CurveOf<point2d> SpecialSource::Cubic()
 {
-    const CurveOf<POINT> integers = OrdinarySource::IntegerCubic();
-    CurveOf<point2d> curve;
-    std::ranges::transform(integers, curve.begin(), [](const POINT& p) { return point2d{double(p.x), double(p.y)}; });
+    CurveOf<point2d> curve = UnreplacedCubic();
     ReplaceControlPoints(curve);
     return curve;
 }
 
 CurveOf<POINT> SpecialSource::IntegerCubic()
 {
-    CurveOf<POINT> curve = OrdinarySource::IntegerCubic();
+    CurveOf<POINT> curve = CoincidentSource::IntegerCubic();
     ReplaceControlPoints(curve);
     return curve;
 }
 
 Coefficients SpecialSource::PowerForm()
 {
-    const CurveOf<POINT> integers = OrdinarySource::IntegerCubic();
-    CurveOf<point2d> curve;
-    std::ranges::transform(integers, curve.begin(), [](const POINT& p) { return point2d{double(p.x), double(p.y)}; });
-    Coefficients form = Catalogue::ToPowerForm(curve);
+    Coefficients form = Catalogue::ToPowerForm(UnreplacedCubic());
     Replace(form.a, "a");
     Replace(form.b, "b");
     Replace(form.c, "c");
@@ -146,34 +150,41 @@ bool SpecialSource::IsPlaceOf(bool isInteger, const std::string& name)
 {
     if (isInteger != special.isInteger)
         return false;
-    names.push_back(name);
-    return specialPlace == static_cast<int>(names.size()) - 1;
+    if (IsCounting())
+        names.push_back(name);
+    return places++ == specialPlace;
 }
 
-/// The name with a number behind it, from the second of that name on.
-std::string SpecialSource::Numbered(const std::string& name) const
+/// The names are asked for once a function, and the numbers a thousand times.
+bool SpecialSource::IsCounting() const noexcept
 {
-    const auto isSame = [&name](const std::string& other) { return other.starts_with(name); };
-    const auto before = std::ranges::count_if(names, isSame);
-    return before == 0 ? name : name + std::to_string(before + 1);
+    return specialPlace < 0;
+}
+
+/// The name with a number behind it, from the second draw of that name on.
+std::string SpecialSource::Numbered(const char* name)
+{
+    if (!IsCounting())
+        return {};
+    const int count = ++draws[name];
+    return count == 1 ? name : name + std::to_string(count);
 }
 
 template <typename P>
-void SpecialSource::Replace(P& point, const std::string& name)
+void SpecialSource::Replace(P& point, const char* name)
 {
-    const auto isSame = [&name](const std::string& other) { return other.starts_with(name) && other.ends_with(".x"); };
-    const auto before = std::ranges::count_if(names, isSame);
-    const std::string numbered = before == 0 ? name : name + std::to_string(before + 1);
+    const std::string numbered = Numbered(name);
     point.x = Replaced(point.x, numbered + ".x");
     point.y = Replaced(point.y, numbered + ".y");
 }
 
+/// After the curve is drawn.
 template <typename P>
 void SpecialSource::ReplaceControlPoints(CurveOf<P>& curve)
 {
-    const std::string letter = curves++ == 0 ? "P" : "Q";
+    constexpr const char* pointNames[2][4] = {{"P0", "P1", "P2", "P3"}, {"Q0", "Q1", "Q2", "Q3"}};
     for (std::size_t i = 0; i < 4; ++i)
-        Replace(curve[i], letter + std::to_string(i));
+        Replace(curve[i], pointNames[Curves() == 1 ? 0 : 1][i]);
 }
 
 } // namespace ZarnMath::Degenerate

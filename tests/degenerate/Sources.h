@@ -5,6 +5,7 @@
 #include "tests/catalogue/OrdinarySource.h"
 
 #include <array>
+#include <map>
 #include <string>
 #include <vector>
 
@@ -19,7 +20,10 @@ class CoincidentSource : public Catalogue::OrdinarySource
 public:
     /// @param classes which points coincide
     /// @param whose   which of the curves that the call draws, from 0 on
-    CoincidentSource(const Partition& classes, int whose) noexcept : partition(classes), degenerateCurve(whose) {}
+    /// @param setFlags what every flag is
+    CoincidentSource(const Partition& classes, int whose, bool setFlags = true) noexcept
+        : OrdinarySource(setFlags), partition(classes), degenerateCurve(whose)
+    {}
 
     Catalogue::CurveOf<POINT> IntegerCubic() override;
 
@@ -47,15 +51,20 @@ struct Special
 /// NaN, the infinities, the zeros, the smallest and the largest number; the smallest and the largest integer.
 extern const std::array<Special, 9> specials;
 
+inline constexpr Partition distinctPoints = {0, 1, 2, 3};
+
 /// Replaces one of the numbers that a call draws.
-class SpecialSource : public Catalogue::OrdinarySource
+class SpecialSource : public CoincidentSource
 {
 public:
-    /// @param setFlags what every flag is
     /// @param value    what stands in
     /// @param place    which number it replaces, counted from 0 over those of its type; -1 for none
-    SpecialSource(bool setFlags, const Special& value, int place) noexcept
-        : OrdinarySource(setFlags), special(value), specialPlace(place)
+    /// @param classes  which control points coincide, but for the number that is replaced
+    /// @param whose    in which of the curves
+    /// @param setFlags what every flag is
+    SpecialSource(const Special& value, int place, const Partition& classes = distinctPoints, int whose = 0,
+                  bool setFlags = true) noexcept
+        : CoincidentSource(classes, whose, setFlags), special(value), specialPlace(place)
     {}
 
     double Number() override;
@@ -75,7 +84,8 @@ public:
     /// The special value stands in for a coefficient.
     Catalogue::Coefficients PowerForm() override;
 
-    /// What the numbers of the special value's type were drawn as, in order: `t`, `P0.x` and the like.
+    /// What the numbers of the special value's type were drawn as, in order, where none was replaced: `t`, `P0.x` and the
+    /// like.
     [[nodiscard]] const std::vector<std::string>& Names() const noexcept
     {
         return names;
@@ -85,16 +95,19 @@ private:
     double Replaced(double value, const std::string& name);
     std::int32_t Replaced(std::int32_t value, const std::string& name);
     bool IsPlaceOf(bool isInteger, const std::string& name);
-    std::string Numbered(const std::string& name) const;
+    std::string Numbered(const char* name);
+    [[nodiscard]] bool IsCounting() const noexcept;
     template <typename P>
-    void Replace(P& point, const std::string& name);
+    void Replace(P& point, const char* name);
     template <typename P>
     void ReplaceControlPoints(Catalogue::CurveOf<P>& curve);
+    Catalogue::CurveOf<point2d> UnreplacedCubic();
 
     const Special& special;
     int specialPlace;
-    int curves = 0;
+    int places = 0;
     std::vector<std::string> names;
+    std::map<std::string, int> draws;
 };
 
 } // namespace ZarnMath::Degenerate
