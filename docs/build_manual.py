@@ -18,7 +18,7 @@ from pathlib import Path
 import check_docstrings
 
 ROOT = Path(__file__).resolve().parent.parent
-EXPORTED = ROOT / "tests/library/ExportedNames.txt"
+EXPORTED = ROOT / "tests/library/ExportedSymbols.txt"
 
 
 def version():

@@ -24,14 +24,16 @@ constexpr std::array<CurveOf<POINT>, 3> curves = {{
 
 } // namespace
 
+// Each of these draws by itself and not through another: a source that replaces one leaves the others as they are.
+
 double OrdinarySource::Number()
 {
-    return Coordinate() / 64.0;
+    return Take(coordinates, next) / 64.0;
 }
 
 float OrdinarySource::Single()
 {
-    return static_cast<float>(Number());
+    return static_cast<float>(Take(coordinates, next)) / 64.0F;
 }
 
 std::int32_t OrdinarySource::Integer()
@@ -61,12 +63,12 @@ double OrdinarySource::Parameter()
 
 double OrdinarySource::Angle(double turn)
 {
-    return Parameter() * turn;
+    return Take(parameters, next) * turn;
 }
 
 std::int32_t OrdinarySource::IntegerAngle()
 {
-    return Integer() * 1'000'000;
+    return Take(coordinates, next) * 1'000'000;
 }
 
 double OrdinarySource::Tolerance()
@@ -79,15 +81,10 @@ double OrdinarySource::Distance()
     return 20.0;
 }
 
-CurveOf<POINT> OrdinarySource::NextCurve()
-{
-    return Take(curves, next);
-}
-
 CurveOf<point2d> OrdinarySource::Cubic()
 {
     CurveOf<point2d> curve;
-    std::ranges::transform(NextCurve(), curve.begin(), [](const POINT& p) {
+    std::ranges::transform(IntegerCubic(), curve.begin(), [](const POINT& p) {
         return point2d{double(p.x), double(p.y)};
     });
     return curve;
@@ -95,7 +92,7 @@ CurveOf<point2d> OrdinarySource::Cubic()
 
 CurveOf<POINT> OrdinarySource::IntegerCubic()
 {
-    return NextCurve();
+    return Take(curves, next);
 }
 
 } // namespace ZarnMath::Catalogue

@@ -26,12 +26,10 @@ public:
     std::int32_t IntegerAngle() override;
     double Tolerance() override;
     double Distance() override;
+    /// The points of `IntegerCubic`.
     CurveOf<point2d> Cubic() override;
+    /// Four different points.
     CurveOf<POINT> IntegerCubic() override;
-
-protected:
-    /// The control points of the next curve, all different.
-    CurveOf<POINT> NextCurve();
 
 private:
     bool flags;
