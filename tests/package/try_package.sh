@@ -14,7 +14,7 @@ counted=0
 clean_up() {
     rm -rf "$work"
     if [ -n "${installed_packages:-}" ]; then
-        dpkg --remove libzarnmath-dev "libzarnmath$version" >/dev/null 2>&1 || true
+        dpkg --purge libzarnmath-dev "libzarnmath$version" >/dev/null 2>&1 || true
     fi
 }
 trap clean_up EXIT
@@ -171,7 +171,7 @@ try_packages() {
     lintian --fail-on error,warning --allow-root "$build/deb/"*.deb
     passed "lintian has nothing to say"
 
-    if [ "$(id -u)" = 0 ] && ! dpkg-query -W "libzarnmath$version" >/dev/null 2>&1; then
+    if [ "$(id -u)" = 0 ] && ! dpkg-query -W | grep -q '^libzarnmath'; then
         installed_packages=yes
         quietly dpkg --install "$build/deb/"*.deb
         local folder
@@ -184,9 +184,9 @@ try_packages() {
         # A program needs no more than the library to run.
         # shellcheck disable=SC2046
         quietly gcc -std=c99 "$folder/PlainCTest.c" $(pkg-config --cflags --libs zarnmath) -o "$folder/plain"
-        quietly dpkg --remove libzarnmath-dev
+        quietly dpkg --purge libzarnmath-dev
         quietly "$folder/plain"
-        quietly dpkg --remove "libzarnmath$version"
+        quietly dpkg --purge "libzarnmath$version"
         installed_packages=
         refused libZarnMath "$folder/plain"
         passed "the packages are gone again"
