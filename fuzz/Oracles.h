@@ -6,9 +6,9 @@
 #include "ZarnMath/ValueTypes.h"
 
 #include <cmath>
+#include <cstdio>
 #include <cstdlib>
 #include <cstring>
-#include <iostream>
 #include <limits>
 #include <vector>
 
@@ -19,7 +19,7 @@ inline void Require(bool kept, const char* promise)
 {
     if (kept)
         return;
-    std::cerr << "not kept: " << promise << '\n';
+    std::fprintf(stderr, "not kept: %s\n", promise);
     std::abort();
 }
 

@@ -191,12 +191,16 @@ struct FieldWithModel
     VectorField field;
     Model model;
 
-    void Check()
+    void CheckBounds() const
     {
         CheckRows(field);
         Require(field.width == model.width && field.height == model.height && field.originX == model.x &&
                     field.originY == model.y,
                 "the bounds are as asked for");
+    }
+
+    void CheckCells()
+    {
         for (int py = model.y - 1; py <= model.y + model.height; ++py) {
             for (int px = model.x - 1; px <= model.x + model.width; ++px) {
                 const Vector expected = model.IsInside(px, py) ? model.At(px, py) : Vector{};
@@ -309,7 +313,8 @@ void ChangeBlocks(FieldWithModel& target, FieldWithModel& other, Input& input)
             "VectorField::GetRegion", [&] { return target.field.GetRegion(rect); }, size);
         region.Follow();
         region.model.Blit(target.model, 0, 0);
-        region.Check();
+        region.CheckBounds();
+        region.CheckCells();
         break;
     }
     }
@@ -359,8 +364,10 @@ void FuzzNearOrigin(Input& input)
             Fill(target, input);
             break;
         }
-        target.Check();
+        target.CheckBounds();
     }
+    for (FieldWithModel& field : fields) // all of the cells, once: what goes wrong on the way does not heal
+        field.CheckCells();
 }
 
 /// @}
