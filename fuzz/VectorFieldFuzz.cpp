@@ -296,7 +296,7 @@ void ChangeBlocks(FieldWithModel& target, FieldWithModel& other, Input& input)
         break;
     }
     case 1: {
-        if (std::max(target.field.height, target.field.width) > 400)
+        if (std::max(target.field.height, target.field.width) > 100)
             return;
         RECT moved = source.field.GetZGIRECT();
         TranslateRect(moved, dx, dy);
