@@ -346,7 +346,8 @@ extern template ZARNMATH_API double Length<point2d>(const point2d*, LengthAccura
 /// @param[out] point           the nearest point, by Horner's rule
 /// @param[out] distanceSquared its squared distance from q
 /// @return whether there is a stationary point. If not, the three results are untouched. Among equal distances the
-///         candidate that the root finder lists first stays. A curve collapsed to a point has none.
+///         candidate that the root finder lists first stays. A curve collapsed to a point has none. Where every squared
+///         distance overflows, distanceSquared is the largest double, and t and point are untouched
 /// @arithmetic
 ZARNMATH_API bool FindClosestPointOnBezier(const point2d& a, const point2d& b, const point2d& c, const point2d& d,
                                            const point2d& q, double& t, point2d& point,

@@ -72,7 +72,8 @@ void FindBezierIntersections(point2d a1, point2d b1, point2d c1, point2d d1, poi
 ///
 /// @param straight, other            four control points each
 /// @param[in,out] straightParameters parameters of the nearest points on the first curve
-/// @param[in,out] otherParameters    parameters of the crossings, in (0, 1), at most three, in the root finder's order
+/// @param[in,out] otherParameters    parameters of the crossings, at most three, in the root finder's order; in (0, 1) but
+///                                   for a double root, whose search is not confined
 /// @param[in,out] points             the crossings, on the other curve
 /// @return whether anything was found. The three vectors are appended to, and untouched where nothing was found.
 bool StraightBezierIntersectionTest(const point2d* straight, const point2d* other,

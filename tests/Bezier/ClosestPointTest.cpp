@@ -190,6 +190,17 @@ TEST(ClosestPoint, MayTakeItsResultForTheQuery)
     EXPECT_EQ(distanceSquared, nearest.distanceSquared);
 }
 
+// Found by the fuzzer: the square of the distance overflows, but none of the quintic's coefficients does.
+TEST(ClosestPoint, FartherThanAnySquareLeavesParameterAndPointAlone)
+{
+    constexpr Cubic curve{{{0.0, 0.0}, {100.0, 300.0}, {200.0, -300.0}, {300.0, 0.0}}};
+    Nearest<point2d> nearest;
+    EXPECT_TRUE(Find(curve, point2d{0.0, 1e160}, nearest));
+    EXPECT_EQ(nearest.distanceSquared, std::numeric_limits<double>::max());
+    EXPECT_TRUE(SameBits(nearest.t, sentinel<double>));
+    EXPECT_TRUE(SameBits(nearest.point, sentinel<point2d>));
+}
+
 TEST(ClosestPoint, OfNaNIsNotFound)
 {
     Nearest<point2d> nearest;

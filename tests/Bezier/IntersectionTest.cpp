@@ -318,6 +318,22 @@ TEST(StraightIntersection, OfACurvedFirstCurveIsFalse)
     EXPECT_EQ(test.c, occupied);
 }
 
+// Found by the fuzzer: the start of the first curve touches the chord of the second, but for rounding. The search for a
+// double root is not confined, and begins at the far side of the start.
+TEST(StraightIntersection, OfADoubleRootAtTheStartMayLieJustBeforeIt)
+{
+    constexpr double tiny = -1.0137257062542612e-26;
+    constexpr double tinier = -1.090071220342426e-175;
+    constexpr Cubic first{{{tinier, tiny}, {tiny, tiny}, {tiny, tiny}, {155.0, 0.0}}};
+    constexpr Cubic second{
+        {{0.0, -1.0900014248103328e-175}, {tiny, tiny}, {tiny, tiny}, {-1.0900712368164881e-175, tiny}}};
+    const Crossings c = Intersect(first, second);
+    ASSERT_EQ(c.first.size(), 1U);
+    EXPECT_LT(c.first[0], 0.0);
+    EXPECT_GT(c.first[0], -2e-07); // the width of a sliver
+    EXPECT_NEAR(c.second[0], 0.5, 1e-06);
+}
+
 TEST(AlgebraicIntersection, TakesPowerFormsAndClears)
 {
     // x = t, y = 8*t^3 - 4*t against x = s, y = s^3 + s: 7*t^3 = 5*t, at 0 and the root of 5/7.
