@@ -1,5 +1,6 @@
 #include "ZarnMath/BezierToLinesInternal.h"
 
+#include "ZarnMath/Bezier/Pair.h"
 #include "ZarnMath/Bezier/PowerForm.h"
 
 #include <algorithm>
@@ -221,23 +222,21 @@ namespace ZarnMath::CubicBezier {
 template <typename P, typename I>
 void GetLooseBounds(const P* curve, I& minX, I& minY, I& maxX, I& maxY) noexcept
 {
-    const auto up = [](double v) { return RoundToInt(std::ceil(v)); };
-    const auto down = [](double v) { return RoundToInt(std::floor(v)); };
-    maxX = up(curve[0].x);
-    maxY = up(curve[0].y);
-    minX = down(curve[0].x);
-    minY = down(curve[0].y);
+    // Rounding keeps the order of numbers, so that the extremes alone need it. A NaN at the start rounds to 0, with which
+    // the other points are compared.
+    const auto orZero = [](double v) { return v == v ? v : 0.0; };
+    const Pair start{orZero(curve[0].x), orZero(curve[0].y)};
+    Pair low = start;
+    Pair high = start;
     for (int i = 1; i < 4; ++i) {
-        const auto& [x, y] = curve[i];
-        if (x > maxX)
-            maxX = up(x);
-        if (y > maxY)
-            maxY = up(y);
-        if (x < minX)
-            minX = down(x);
-        if (y < minY)
-            minY = down(y);
+        const Pair p = LoadPair(curve[i]);
+        low = p < low ? p : low;
+        high = p > high ? p : high;
     }
+    minX = FloorToInt(low[0]);
+    minY = FloorToInt(low[1]);
+    maxX = CeilToInt(high[0]);
+    maxY = CeilToInt(high[1]);
 }
 
 template void GetLooseBounds<point2d, int>(const point2d*, int&, int&, int&, int&) noexcept;

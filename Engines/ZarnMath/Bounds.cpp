@@ -1,6 +1,8 @@
 #include "ZarnMath/Bounds.h"
 
+#include "ZarnMath/Bezier/Pair.h"
 #include "ZarnMath/ValueTypesInternal.h"
+#include "ZarnMath/WMath/WideRegisters.h"
 #include "ZarnMath/WMathInternal.h"
 
 #include <algorithm>
@@ -30,16 +32,117 @@ void Widen(Box& box, const P& p) noexcept
         box.bottom = p.y;
 }
 
+/// Four integer points in one vector, which becomes two or four where registers are narrow.
+using FourPoints = std::int32_t __attribute__((vector_size(32)));
+
+/// Widens by four integer points at a time, which do not mind in which order they are compared. Nor do those near the end
+/// mind being compared twice.
+///
+/// @param count at least 4
+[[gnu::always_inline]] inline RECT WidenedByFours(const RECT& box, const POINT* points, std::uint64_t count) noexcept
+{
+    const auto [left, top, right, bottom] = box;
+    FourPoints low{left, bottom, left, bottom, left, bottom, left, bottom};
+    FourPoints high{right, top, right, top, right, top, right, top};
+    const auto widen = [&](const FourPoints& p, const FourPoints& q) __attribute__((always_inline))
+    {
+        low = p < low ? p : low;
+        high = q > high ? q : high;
+    };
+    const auto widenByFour = [&](const POINT* four) __attribute__((always_inline))
+    {
+        FourPoints p;
+        std::memcpy(&p, four, sizeof p);
+        widen(p, p);
+    };
+    for (std::uint64_t i = 0; i + 4 <= count; i += 4)
+        widenByFour(points + i);
+    widenByFour(points + count - 4);
+    widen(__builtin_shufflevector(low, low, 4, 5, 6, 7, 0, 1, 2, 3),
+          __builtin_shufflevector(high, high, 4, 5, 6, 7, 0, 1, 2, 3));
+    widen(__builtin_shufflevector(low, low, 2, 3, 0, 1, 6, 7, 4, 5),
+          __builtin_shufflevector(high, high, 2, 3, 0, 1, 6, 7, 4, 5));
+    return {low[0], high[1], high[0], low[1]};
+}
+
+/// The box widened by integer points.
+[[nodiscard, gnu::always_inline]] inline RECT Widened(RECT box, const POINT* points, std::uint64_t count) noexcept
+{
+    constexpr std::uint64_t manyPoints = 8;
+    if (count >= manyPoints)
+        return OnWidestRegisters([=]() __attribute__((always_inline)) { return WidenedByFours(box, points, count); });
+    for (std::uint64_t i = 0; i < count; ++i)
+        Widen(box, points[i]);
+    return box;
+}
+
+/// A box on its way along the points, both coordinates at once. Of two zeros it keeps the earlier one, and of a NaN
+/// nothing, as `Widen` does.
+class PairedBox
+{
+public:
+    explicit PairedBox(const BoundsT<double>& box) noexcept : low{box.left, box.bottom}, high{box.right, box.top} {}
+
+    void Widen(const Pair& p) noexcept
+    {
+        low = p < low ? p : low;
+        high = p > high ? p : high;
+    }
+
+    [[nodiscard]] BoundsT<double> Box() const noexcept
+    {
+        return {low[0], high[1], high[0], low[1]};
+    }
+
+private:
+    Pair low;
+    Pair high;
+};
+
+[[nodiscard]] BoundsT<double> Widened(const BoundsT<double>& box, const point2d* points, std::uint64_t count) noexcept
+{
+    PairedBox widened(box);
+    for (std::uint64_t i = 0; i < count; ++i)
+        widened.Widen(LoadPair(points[i]));
+    return widened.Box();
+}
+
 /// Seeded by the first point, not by the empty box, so that it is right beyond the integer limits too.
 template <typename Box, typename P>
 Box BoxOf(const P* points, int count, const Box& empty) noexcept
 {
     if (points == nullptr || count < 1)
         return empty;
-    Box box{points[0].x, points[0].y, points[0].x, points[0].y};
-    for (int i = 1; i < count; ++i)
-        Widen(box, points[i]);
-    return box;
+    const Box first{points[0].x, points[0].y, points[0].x, points[0].y};
+    return Widened(first, points + 1, static_cast<std::uint64_t>(count) - 1);
+}
+
+/// A matrix by its columns, for both coordinates of an image at once.
+class PairedMatrix
+{
+public:
+    explicit PairedMatrix(const MATRIX& m) noexcept : x{m.m11, m.m21}, y{m.m12, m.m22}, translation{m.dx, m.dy} {}
+
+    [[nodiscard]] Pair Image(const point2d& p) const noexcept
+    {
+        return translation + (x * Both(p.x) + y * Both(p.y));
+    }
+
+private:
+    Pair x;
+    Pair y;
+    Pair translation;
+};
+
+/// Around the images of points, on top of the empty box.
+template <typename P>
+BoundsT<double> BoxOfImages(const P* points, std::uint64_t count, const MATRIX& m) noexcept
+{
+    const PairedMatrix paired(m);
+    PairedBox box(emptyBounds);
+    for (std::uint64_t i = 0; i < count; ++i)
+        box.Widen(paired.Image(ToPoint2d(points[i])));
+    return box.Box();
 }
 
 bool IsStrictlyNonEmpty(const RECT& rect) noexcept
@@ -146,19 +249,19 @@ void UnionPointWithRect(RECT& rect, const POINT& p) noexcept
 void UnionPointWithRect(RECT& rect, const point2d& p) noexcept
 {
     if (p.x > rect.right)
-        rect.right = RoundToInt(std::ceil(p.x));
+        rect.right = CeilToInt(p.x);
     if (p.y > rect.top)
-        rect.top = RoundToInt(std::ceil(p.y));
+        rect.top = CeilToInt(p.y);
     if (p.x < rect.left)
-        rect.left = RoundToInt(std::floor(p.x));
+        rect.left = FloorToInt(p.x);
     if (p.y < rect.bottom)
-        rect.bottom = RoundToInt(std::floor(p.y));
+        rect.bottom = FloorToInt(p.y);
 }
 
 void UnionPointsWithRect(RECT& rect, const POINT* points, int count) noexcept
 {
-    for (int i = 0; i < count; ++i)
-        Widen(rect, points[i]);
+    if (count > 0)
+        rect = Widened(rect, points, static_cast<std::uint64_t>(count));
 }
 
 bool UnionRect(RECT& a, const RECT& b) noexcept
@@ -274,18 +377,13 @@ BoundsT<double> GetUntransformedBBox(const BoundsT<double>& box, const MATRIX& m
 
 RECT GetTransformedPointsBBox(const POINT* points, unsigned long count, const MATRIX& m) noexcept
 {
-    RECT box = emptyRect;
-    for (unsigned long i = 0; i < count; ++i)
-        UnionPointWithRect(box, Image(m, ToPoint2d(points[i])));
-    return box;
+    // Rounding keeps the order of numbers and leaves whole ones alone: the extremes alone need it.
+    return RoundOutward(BoxOfImages(points, count, m));
 }
 
 BoundsT<double> GetTransformedPointsBBox(const point2d* points, unsigned long count, const MATRIX& m) noexcept
 {
-    BoundsT<double> box = emptyBounds;
-    for (unsigned long i = 0; i < count; ++i)
-        Widen(box, Image(m, points[i]));
-    return box;
+    return BoxOfImages(points, count, m);
 }
 
 point2d GetRemappedPoint(const point2d& p, const BoundsT<double>& from, const BoundsT<double>& to) noexcept

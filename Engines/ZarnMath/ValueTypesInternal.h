@@ -1,5 +1,5 @@
 /// @file
-/// Integer arithmetic that wraps, and the difference of points as control polygons need it. Internal.
+/// Integer arithmetic that wraps, rounding outward, and the difference of points as control polygons need it. Internal.
 #pragma once
 
 #include "ZarnMath/ValueTypes.h"
@@ -22,6 +22,26 @@ namespace ZarnMath {
 [[nodiscard]] constexpr std::int32_t WrappingMultiply(std::int32_t a, std::int32_t b) noexcept
 {
     return static_cast<std::int32_t>(static_cast<std::uint32_t>(a) * static_cast<std::uint32_t>(b));
+}
+
+/// The least integer that is not below v, by `RoundToInt`, which saturates: that of std::ceil(v), without a call.
+[[nodiscard]] constexpr std::int32_t CeilToInt(double v) noexcept
+{
+    const std::int32_t whole = TruncateToInt(v);
+    return whole < v && whole != std::numeric_limits<std::int32_t>::max() ? whole + 1 : whole;
+}
+
+/// The greatest integer that is not above v, in the same way.
+[[nodiscard]] constexpr std::int32_t FloorToInt(double v) noexcept
+{
+    const std::int32_t whole = TruncateToInt(v);
+    return whole > v && whole != std::numeric_limits<std::int32_t>::min() ? whole - 1 : whole;
+}
+
+/// The integer box that encloses another one: maxima go up, minima down.
+[[nodiscard]] constexpr RECT RoundOutward(const BoundsT<double>& box) noexcept
+{
+    return {FloorToInt(box.left), CeilToInt(box.top), CeilToInt(box.right), FloorToInt(box.bottom)};
 }
 
 /// a - b in double.

@@ -42,6 +42,10 @@ Vector Interpolate(const Vector& a, const Vector& b, float t) noexcept
 Vector InterpolateColumns(const VectorField::Row& row, std::int64_t i, float t) noexcept
 {
     const auto column = static_cast<std::uint64_t>(i);
+    if (static_cast<std::int64_t>(row.start) <= i && i + 1 < static_cast<std::int64_t>(row.end)) {
+        const Vector* cell = row.data.data() + (column - row.start);
+        return Interpolate(cell[0], cell[1], t);
+    }
     return Interpolate(row[column], row[column + 1], t);
 }
 
@@ -163,12 +167,12 @@ Vector VectorField::Get(vector2dT<float, true> position) const noexcept
     // beyond it.
     const auto ix = static_cast<std::int64_t>(fx);
     const auto iy = static_cast<std::int64_t>(fy);
-    const auto row = [this](std::int64_t i) -> const Row& {
-        return rows[static_cast<std::size_t>(std::min<std::int64_t>(i, height - 1))];
-    };
+    const std::int64_t last = std::int64_t{height} - 1;
+    const Row* lower = rows.data() + std::min(iy, last);
+    const Row* upper = lower + (iy < last ? 1 : 0);
     const float tx = fx - static_cast<float>(ix);
     const float ty = fy - static_cast<float>(iy);
-    return Interpolate(InterpolateColumns(row(iy), ix, tx), InterpolateColumns(row(iy + 1), ix, tx), ty);
+    return Interpolate(InterpolateColumns(*lower, ix, tx), InterpolateColumns(*upper, ix, tx), ty);
 }
 
 } // namespace ZarnMath

@@ -7,6 +7,7 @@
 
 #include "ZarnMath/ValueTypes.h"
 
+#include <bit>
 #include <cstring>
 
 namespace ZarnMath {
@@ -20,7 +21,8 @@ using PairMask = decltype(Pair{} < Pair{});
     return Pair{v, v};
 }
 
-[[nodiscard]] inline Pair LoadPair(const vector2d& v) noexcept
+template <bool IsPosition>
+[[nodiscard]] inline Pair LoadPair(const vector2dT<double, IsPosition>& v) noexcept
 {
     Pair p;
     std::memcpy(&p, &v, sizeof p);
@@ -35,7 +37,8 @@ inline void StorePair(vector2d& v, Pair p) noexcept
 
 [[nodiscard]] inline Pair Absolute(Pair p) noexcept
 {
-    return p < Both(0.0) ? -p : p;
+    constexpr std::int64_t allButTheSign = std::numeric_limits<std::int64_t>::max();
+    return std::bit_cast<Pair>(std::bit_cast<PairMask>(p) & PairMask{allButTheSign, allButTheSign});
 }
 
 [[nodiscard]] inline bool IsAny(PairMask mask) noexcept

@@ -2,11 +2,14 @@
 /// Newton's method on several roots of one polynomial at once. Internal.
 ///
 /// Each step of Horner's rule waits for the one before, so that a single root leaves most of the processor idle. Roots
-/// that are isolated already do not depend on each other and fill that time. Every one of them takes the very steps of
-/// `FindSolutionNewtonsMethod_Guaranteed`.
+/// that are isolated already do not depend on each other and fill that time. A branch on whether a root has been found
+/// would make the processor wait too: nearly all need three or four steps, so that the first four are taken blindly, and
+/// the iterate that `FindSolutionNewtonsMethod_Guaranteed` would have ended with is picked afterwards.
 #pragma once
 
 #include "ZarnMath/RootFinder.h"
+
+#include <algorithm>
 
 namespace ZarnMath::RootFinder {
 
@@ -19,46 +22,59 @@ struct Crossing
     int place;
 };
 
-/// Two crossings on their way, in the two halves of a pair.
-struct CrossingPair
+/// Two roots on their way, in the two halves of a pair.
+class RootPair
 {
-    Pair start;
-    Pair lower;
-    Pair upper;
-    Pair t;
-    Pair previous;
-    Pair root;
-    PairMask isOpen;
+public:
+    /// More steps than these are left to the plain method.
+    static constexpr int mostSteps = 8;
 
-    CrossingPair() = default;
+    RootPair() = default;
 
-    CrossingPair(const Crossing& first, const Crossing& second) noexcept
-        : start{first.start, second.start}, lower{first.lower, second.lower}, upper{first.upper, second.upper},
-          t(start), previous(Both(1.0)), root(start), isOpen(t == t)
+    RootPair(double first, double second) noexcept
+        : t{first, second}, length(Both(1.0)), isShrinking(t == t), longSteps{}
     {}
 
-    /// Closes the halves in the mask, with a value that counts where it lies strictly within the bounds.
-    void Close(PairMask which, Pair value) noexcept
+    /// The last iterate.
+    [[nodiscard]] const Pair& Last() const noexcept
     {
-        const PairMask counts = isOpen & which & (lower < value) & (value < upper);
-        root = counts ? value : root;
-        isOpen &= ~which;
+        return t;
     }
 
-    /// Takes the next iterate, or closes. A crossing that has been closed goes on idly: its root stands.
-    void Advance(Pair value, Pair slope) noexcept
+    /// Takes an iterate down. The search ends at the first step below the tolerance; those before it have to shrink.
+    void Append(int step, const Pair& next) noexcept
     {
-        const Pair next = t - value / slope;
-        const Pair delta = Absolute(t - next);
-        const PairMask hasSlope = slope != Both(0.0);
-        const PairMask hasConverged = delta < Both(rootTolerance);
-        Close(~hasSlope, start);
-        Close(hasConverged, next);
-        Close(delta >= previous, t);
-        Close(delta != delta, start);
-        previous = delta;
+        const Pair tolerance = Both(rootTolerance);
+        const Pair nextLength = Absolute(t - next);
+        isShrinking &= nextLength < (length > tolerance ? length : tolerance);
+        longSteps -= nextLength >= tolerance;
+        length = nextLength;
         t = next;
+        iterates[step] = next;
     }
+
+    /// Whether a root has not converged yet. False for NaN.
+    [[nodiscard]] PairMask IsOpen() const noexcept
+    {
+        return length >= Both(rootTolerance);
+    }
+
+    /// @param[out] root where the search of that half has ended
+    /// @return whether it has, in the ordinary course
+    [[nodiscard]] bool HasConverged(int half, double& root) const noexcept
+    {
+        if (isShrinking[half] == 0 || !(length[half] < rootTolerance))
+            return false;
+        root = iterates[longSteps[half]][half];
+        return true;
+    }
+
+private:
+    Pair t;
+    Pair length;          ///< of the step to the last iterate
+    PairMask isShrinking; ///< no step that was long has been longer than the one before
+    PairMask longSteps;   ///< how many were not below the tolerance
+    Pair iterates[mostSteps];
 };
 
 /// A polynomial and its derivative, each coefficient in both halves of a pair.
@@ -70,19 +86,18 @@ struct PairedPolynomial
 
     explicit PairedPolynomial(const double* c) noexcept
     {
-        const Derivative<N> derivative(c);
 #pragma GCC unroll 16
         for (int i = 0; i < N; ++i) {
             value[i] = Both(c[i]);
-            slope[i] = Both(derivative.c[i]);
+            slope[i] = value[i] * Both(N - i);
         }
         value[N] = Both(c[N]);
     }
 };
 
-/// One step of Newton's method on each of the crossings.
+/// One step of Newton's method on each of the roots.
 template <int N, int Pairs>
-[[gnu::always_inline]] inline void AdvanceTogether(const PairedPolynomial<N>& p, CrossingPair* pairs) noexcept
+[[gnu::always_inline]] inline void StepTogether(const PairedPolynomial<N>& p, int step, RootPair* pairs) noexcept
 {
     Pair value[Pairs];
     Pair slope[Pairs];
@@ -95,37 +110,40 @@ template <int N, int Pairs>
     for (int i = 1; i < N; ++i) {
 #pragma GCC unroll 4
         for (int k = 0; k < Pairs; ++k) {
-            value[k] = p.value[i] + pairs[k].t * value[k];
-            slope[k] = p.slope[i] + pairs[k].t * slope[k];
+            value[k] = p.value[i] + pairs[k].Last() * value[k];
+            slope[k] = p.slope[i] + pairs[k].Last() * slope[k];
         }
     }
 #pragma GCC unroll 4
-    for (int k = 0; k < Pairs; ++k)
-        pairs[k].Advance(p.value[N] + pairs[k].t * value[k], slope[k]);
+    for (int k = 0; k < Pairs; ++k) {
+        const Pair t = pairs[k].Last();
+        pairs[k].Append(step, t - (p.value[N] + t * value[k]) / slope[k]);
+    }
 }
 
-/// Polishes `count` crossings, 2*Pairs - 1 or more, and at most 2*Pairs of them.
+/// Polishes `count` crossings, more than 2*Pairs - 2 and at most 2*Pairs.
 template <int N, int Pairs>
 void PolishTogether(const double* c, const Crossing* crossings, int count, double* roots) noexcept
 {
+    constexpr int blindSteps = 4;
     const PairedPolynomial<N> polynomial(c);
-    CrossingPair pairs[Pairs];
-    PairMask isOpen{};
+    RootPair pairs[Pairs];
 #pragma GCC unroll 4
-    for (int k = 0; k < Pairs; ++k) {
-        pairs[k] = CrossingPair(crossings[2 * k], crossings[2 * k + 1 < count ? 2 * k + 1 : 2 * k]);
-        isOpen |= pairs[k].isOpen;
-    }
-    for (int stepsLeft = 100; stepsLeft > 0 && IsAny(isOpen); --stepsLeft) {
-        AdvanceTogether<N, Pairs>(polynomial, pairs);
-        isOpen = pairs[0].isOpen | pairs[Pairs - 1].isOpen;
-    }
+    for (int k = 0; k < Pairs; ++k)
+        pairs[k] = RootPair(crossings[2 * k].start, crossings[std::min(2 * k + 1, count - 1)].start);
 #pragma GCC unroll 4
-    for (int k = 0; k < Pairs; ++k) {
-        pairs[k].Close(pairs[k].isOpen, pairs[k].t);
-        roots[crossings[2 * k].place] = pairs[k].root[0];
-        if (2 * k + 1 < count)
-            roots[crossings[2 * k + 1].place] = pairs[k].root[1];
+    for (int step = 0; step < blindSteps; ++step)
+        StepTogether<N, Pairs>(polynomial, step, pairs);
+    for (int step = blindSteps; step < RootPair::mostSteps; ++step) {
+        if (!IsAny(pairs[0].IsOpen() | pairs[Pairs - 1].IsOpen()))
+            break;
+        StepTogether<N, Pairs>(polynomial, step, pairs);
+    }
+    for (int i = 0; i < count; ++i) {
+        const auto& [start, lower, upper, place] = crossings[i];
+        double& root = roots[place];
+        if (!pairs[i / 2].HasConverged(i % 2, root) || !(lower < root && root < upper)) [[unlikely]]
+            root = FindSolutionNewtonsMethod_Guaranteed<N>(c, start, lower, upper, rootTolerance);
     }
 }
 
@@ -134,12 +152,9 @@ template <int N>
 void Polish(const double* c, const Crossing* crossings, int count, double* roots) noexcept
 {
     for (; count > 2; crossings += 4, count -= 4)
-        PolishTogether<N, 2>(c, crossings, count, roots);
-    if (count == 2)
+        PolishTogether<N, 2>(c, crossings, std::min(count, 4), roots);
+    if (count > 0)
         PolishTogether<N, 1>(c, crossings, count, roots);
-    if (count == 1)
-        roots[crossings->place] = FindSolutionNewtonsMethod_Guaranteed<N>(c, crossings->start, crossings->lower,
-                                                                          crossings->upper, rootTolerance);
 }
 
 } // namespace ZarnMath::RootFinder

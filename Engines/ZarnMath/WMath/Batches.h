@@ -5,6 +5,7 @@
 /// with the bits of one at a time.
 #pragma once
 
+#include "ZarnMath/WMath/WideRegisters.h"
 #include "ZarnMath/WMathInternal.h"
 
 #include <cstring>
@@ -29,6 +30,16 @@ template <typename Argument>
     return copy;
 }
 
+/// Makes each point step(point, argument), for an argument that the loop cannot change.
+template <typename P, typename Argument, typename Step>
+[[gnu::always_inline]] inline void ForEachPointApart(P* points, std::uint64_t count, const Argument& argument,
+                                                     Step step) noexcept
+{
+    const Argument fixed = argument;
+    for (std::uint64_t i = 0; i < count; ++i)
+        points[i] = step(points[i], fixed);
+}
+
 /// Makes each point step(point, argument), first to last.
 ///
 /// An argument inside the array is read again for each point; any other one is held in registers, which is what lets the
@@ -41,9 +52,7 @@ void ForEachPoint(P* points, std::uint64_t count, const Argument& argument, Step
             points[i] = step(points[i], ReadAnew(argument));
         return;
     }
-    const Argument fixed = argument;
-    for (std::uint64_t i = 0; i < count; ++i)
-        points[i] = step(points[i], fixed);
+    OnWidestRegisters([&]() __attribute__((always_inline)) { ForEachPointApart(points, count, argument, step); });
 }
 
 /// Where a rounded coordinate is cut off: two whole numbers within 32 bits.
