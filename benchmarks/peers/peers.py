@@ -1,4 +1,4 @@
-#!/usr/bin/env python3
+#!/usr/bin/python3
 """Asks all libraries the same questions in one run, and shows the answers side by side.
 
     peers.py BUILD [--rounds N] [--page FILE]
