@@ -1,5 +1,7 @@
 #include "benchmarks/Corpus.h"
 
+#include "benchmarks/Glyphs.h"
+
 #include <algorithm>
 
 namespace ZarnMath::Benchmarks {
@@ -31,6 +33,15 @@ Cubic LongThin(RandomSource& random)
     return curve;
 }
 
+Cubic FromGlyph(RandomSource& random)
+{
+    static const std::vector<Cubic> outlines = GlyphCurves(2.0 * extent);
+    Cubic curve = outlines[static_cast<std::size_t>(random.Integer(0, static_cast<int>(outlines.size()) - 1))];
+    for (point2d& p : curve)
+        p = p - vector2d{extent, extent};
+    return curve;
+}
+
 Cubic RandomCurve(RandomSource& random, CurveClass kind)
 {
     switch (kind) {
@@ -50,6 +61,8 @@ Cubic RandomCurve(RandomSource& random, CurveClass kind)
         return random.Curve(random.AnyShape(), 3.0);
     case CurveClass::Grid:
         return random.Curve(Shape::Grid, extent);
+    case CurveClass::Glyph:
+        return FromGlyph(random);
     case CurveClass::Generic:
         break;
     }

@@ -24,9 +24,10 @@ enum class CurveClass
     Arc,          ///< a quarter of a circle, in any rotation
     Tiny,         ///< of any shape, within a few units
     Grid,         ///< control points on a coarse integer grid, some of them coincident or aligned
+    Glyph,        ///< from the outlines of a font, whose em is the square's side
 };
 
-inline constexpr std::size_t curveClasses = 9;
+inline constexpr std::size_t curveClasses = 10;
 
 /// Elements of each class.
 inline constexpr std::size_t curvesPerClass = 250;
