@@ -112,25 +112,26 @@ void Projection(const std::string& path)
 
 void Layers(const std::string& path)
 {
-    Figure figure(path, {0.0, 330.0, 640.0, 0.0}, 640.0);
-    const auto box = [&figure](double left, double bottom, double width, const char* words, Look look) {
-        figure.Box({left, bottom + 40.0, left + width, bottom}, look);
-        figure.Label({left + width / 2.0, bottom + 20.0}, Beside::On, words);
+    Figure figure(path, {0.0, 330.0, 480.0, 0.0});
+    const auto box = [&figure](double left, int row, double right, const char* words, Look look) {
+        const double bottom = 10.0 + 54.0 * row;
+        figure.Box({left, bottom + 38.0, right, bottom}, look);
+        figure.Label({(left + right) / 2.0, bottom + 19.0}, Beside::On, words);
     };
-    box(10.0, 10.0, 620.0, "value types, tolerances, rounding", "ink");
-    box(10.0, 70.0, 140.0, "root finder", "answer filled");
-    box(165.0, 70.0, 140.0, "boxes", "curve");
-    box(320.0, 70.0, 145.0, "matrices, angles", "curve");
-    box(480.0, 70.0, 150.0, "fit of a line", "curve");
-    box(10.0, 130.0, 140.0, "power form", "answer filled");
-    box(165.0, 130.0, 300.0, "boxes through a matrix, ellipses, layout", "curve");
-    box(480.0, 130.0, 150.0, "lines", "curve");
-    box(10.0, 190.0, 620.0, "one cubic: cutting, length, curvature, nearest point, extents, cusps", "answer filled");
-    box(10.0, 250.0, 140.0, "flattening", "curve");
-    box(165.0, 250.0, 140.0, "crossings", "curve");
-    box(320.0, 250.0, 145.0, "fits of cubics", "curve");
-    box(480.0, 250.0, 150.0, "offsets", "curve");
-    figure.Label({320.0, 312.0}, Beside::On, "beside them: space, fields, tridiagonal systems, numbers", "ink");
+    box(8.0, 0, 472.0, "value types, tolerances, rounding", "ink");
+    box(8.0, 1, 115.0, "root finder", "answer filled");
+    box(125.0, 1, 195.0, "boxes", "curve");
+    box(205.0, 1, 355.0, "matrices, angles", "curve");
+    box(365.0, 1, 472.0, "fit of a line", "curve");
+    box(8.0, 2, 115.0, "power form", "answer filled");
+    box(125.0, 2, 195.0, "fields", "curve");
+    box(205.0, 2, 355.0, "images of boxes", "curve");
+    box(365.0, 2, 472.0, "lines", "curve");
+    box(8.0, 3, 472.0, "one cubic: cutting, length, nearest point, extents", "answer filled");
+    box(8.0, 4, 115.0, "flattening", "curve");
+    box(125.0, 4, 235.0, "crossings", "curve");
+    box(245.0, 4, 472.0, "fits of cubics", "curve");
+    box(245.0, 5, 472.0, "offsets", "curve");
 }
 
 } // namespace ZarnMath::Figures
