@@ -83,10 +83,9 @@ double OrdinarySource::Distance()
 
 CurveOf<point2d> OrdinarySource::Cubic()
 {
+    const CurveOf<POINT> integers = IntegerCubic();
     CurveOf<point2d> curve;
-    std::ranges::transform(IntegerCubic(), curve.begin(), [](const POINT& p) {
-        return point2d{double(p.x), double(p.y)};
-    });
+    std::transform(integers.begin(), integers.end(), curve.begin(), [](const POINT& p) { return ToPoint2d(p); });
     return curve;
 }
 

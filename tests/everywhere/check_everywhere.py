@@ -1,10 +1,11 @@
 """Builds the library for many compilers, options and processors, runs its tests, its vectors and its digests there, and
 writes what came out into a table of the manual.
 
-    check_everywhere.py [--jobs N] [--calls N] [TARGET...]    all targets, or those named; `list` names them
+    check_everywhere.py [--part PART]... [--jobs N] [--calls N] [TARGET...]
 
-A target that was run has its row replaced in docs/same-bits.md. The program ends with 1 where a test or a vector failed,
-or a function of the arithmetic class gave other bits than those recorded in tests/digests.txt.
+All targets, or those named; `list` names them. The parts are digests, vectors and tests, and without a choice all three.
+What was run is put into the target's row in docs/same-bits.md, and the rest of the row stays. The program ends with 1 where
+a test or a vector failed, or a function of the arithmetic class gave other bits than those recorded in tests/digests.txt.
 """
 
 import argparse
@@ -26,13 +27,13 @@ TABLE_BEGIN = "<!-- table made by ./dev check-all -->"
 TABLE_END = "<!-- end of the table -->"
 DIFFERENCES_BEGIN = "<!-- differences found by ./dev check-all -->"
 DIFFERENCES_END = "<!-- end of the differences -->"
-HEADER = ["| target | tests | vectors | calls | arithmetic | platform | functions of the C library that differ |",
-          "|---|---|---|---|---|---|---|"]
+COLUMNS = ["target", "calls", "arithmetic", "platform", "vectors", "C library differs in", "tests"]
+NOT_RUN = "not run"
 
 # What is left out needs threads, a heap that can be limited, files of the system or a shared library: these say nothing
 # about numbers, and run where the library is built for this machine by ./dev test.
 TEST_PROGRAMS = ["UnitTests", "RootFinderLiteralTests"]
-PROGRAMS = ["zarnmath_digest", "VectorTests", *TEST_PROGRAMS]
+PARTS = {"digests": ["zarnmath_digest"], "vectors": ["VectorTests"], "tests": [*TEST_PROGRAMS, "ZarnMathStatic"]}
 
 
 @dataclass
@@ -71,11 +72,11 @@ def run(command, **options):
     return subprocess.run(command, cwd=ROOT, capture_output=True, text=True, check=False, **options)
 
 
-def build(target, jobs):
+def build(target, programs, jobs):
     """Whether everything was built; what went wrong is shown."""
     environment = {**os.environ, "NODE_PATH": "/usr/share/nodejs"}
     configure = ["cmake", "--preset", target.preset, "-B", str(target.folder), *target.settings]
-    compile_all = ["cmake", "--build", str(target.folder), "--parallel", str(jobs), "--target", *PROGRAMS]
+    compile_all = ["cmake", "--build", str(target.folder), "--parallel", str(jobs), "--target", *programs]
     for command in (configure, compile_all):
         result = run(command, env=environment)
         if result.returncode != 0:
@@ -125,30 +126,46 @@ def run_digests(target, calls):
     return (cell if equal == arithmetic else f"**{cell}**"), f"{equal_platform} of {all_platform}", names
 
 
-def measure(target, jobs, calls):
-    """The row of a target, and the functions that differ there."""
-    if not build(target, jobs):
-        return [target.name, "**not built**", "", "", "", "", ""], []
-    arithmetic, of_platform, names = run_digests(target, calls)
-    vectors, differing = run_vectors(target)
-    return [target.name, run_tests(target), vectors, calls, arithmetic, of_platform, ", ".join(differing) or "none"], names
+def measure(target, parts, jobs, calls):
+    """New cells of the target's row, by column, and the functions that differ there, or None where none was called."""
+    if not build(target, [program for part in parts for program in PARTS[part]], jobs):
+        return {column: "**not built**" for column in COLUMNS[1:]}, None
+    cells, names = {}, None
+    if "digests" in parts:
+        arithmetic, of_platform, names = run_digests(target, calls)
+        cells |= {"calls": calls, "arithmetic": arithmetic, "platform": of_platform}
+    if "vectors" in parts:
+        cells["vectors"], differing = run_vectors(target)
+        cells["C library differs in"] = ", ".join(differing) or "nothing"
+    if "tests" in parts:
+        cells["tests"] = run_tests(target)
+    return cells, names
 
 
 def between(page, begin, end):
     return page[page.index(begin) + len(begin):page.index(end)]
 
 
-def write_row(row):
-    """Puts a row in its place among those of the targets."""
+def cells_of(line):
+    return [cell.strip() for cell in line.strip("|").split("|")]
+
+
+def as_line(cells):
+    return "| " + " | ".join(cells) + " |"
+
+
+def write_row(target, cells):
+    """Puts new cells into the target's row, and the row in its place among those of the others."""
     page = PAGE.read_text(encoding="utf-8")
     old = between(page, TABLE_BEGIN, TABLE_END)
-    rows = {line.split("|")[1].strip(): line for line in old.splitlines() if line.startswith("|")}
-    rows[row[0]] = "| " + " | ".join(row) + " |"
-    lines = [*HEADER, *(rows[target.name] for target in list_targets() if target.name in rows)]
-    lines += ["", f"Last run on {datetime.date.today():%d %B %Y}, {platform.system()} on {platform.machine()}, "
+    lines = [cells_of(line) for line in old.splitlines() if line.startswith("|")]
+    rows = {name: dict(zip(COLUMNS[1:], row)) for name, *row in lines[2:]}
+    rows[target.name] = dict.fromkeys(COLUMNS[1:], NOT_RUN) | rows.get(target.name, {}) | cells
+    table = [as_line(COLUMNS), as_line(["---"] * len(COLUMNS))]
+    table += [as_line([one.name, *rows[one.name].values()]) for one in list_targets() if one.name in rows]
+    table += ["", f"Last run on {datetime.date.today():%d %B %Y}, {platform.system()} on {platform.machine()}, "
                   "by `./dev check-all`."]
-    page = page.replace(old, "\n" + "\n".join(lines) + "\n")
-    PAGE.write_text(page, encoding="utf-8")
+    PAGE.write_text(page.replace(TABLE_BEGIN + old, "\n".join([TABLE_BEGIN, *table, ""])), encoding="utf-8")
 
 
 def write_differences(target, names):
@@ -167,6 +184,7 @@ def write_differences(target, names):
 def main():
     parser = argparse.ArgumentParser(description=__doc__.splitlines()[0])
     parser.add_argument("targets", nargs="*")
+    parser.add_argument("--part", action="append", choices=PARTS, dest="parts")
     parser.add_argument("--jobs", type=int, default=2)
     parser.add_argument("--calls", default="100000", help="one of the numbers in the first line of tests/digests.txt")
     arguments = parser.parse_args()
@@ -177,11 +195,12 @@ def main():
     chosen = [target for target in targets if not arguments.targets or target.name in arguments.targets]
     is_well = True
     for target in chosen:
-        row, names = measure(target, arguments.jobs, arguments.calls)
-        print("  ".join(row), flush=True)
-        write_row(row)
-        write_differences(target, names)
-        is_well &= not any("**" in cell for cell in row)
+        cells, names = measure(target, arguments.parts or list(PARTS), arguments.jobs, arguments.calls)
+        print(target.name, *cells.values(), sep="  ", flush=True)
+        write_row(target, cells)
+        if names is not None:
+            write_differences(target, names)
+        is_well &= not any("**" in cell for cell in cells.values())
     return 0 if is_well and chosen else 1
 
 
