@@ -19,6 +19,13 @@ namespace ZarnMath::Digest {
 
 namespace {
 
+#ifdef __EMSCRIPTEN__
+// There the standard output is a console that takes text alone. The file behind it, if it is one, takes any byte.
+std::FILE* const output = std::fopen("/dev/stdout", "wb");
+#else
+std::FILE* const output = stdout;
+#endif
+
 constexpr std::size_t blockSize = std::size_t{1} << 20;
 
 /// The hash of Fowler, Noll and Vo: every function has a seed of its own, whatever stands before it in the list.
@@ -36,14 +43,14 @@ void WriteBlock(std::string& bytes)
 {
     if (bytes.empty())
         return;
-    std::printf("%lu\n", static_cast<unsigned long>(bytes.size()));
-    std::fwrite(bytes.data(), 1, bytes.size(), stdout);
+    std::fprintf(output, "%lu\n", static_cast<unsigned long>(bytes.size()));
+    std::fwrite(bytes.data(), 1, bytes.size(), output);
     bytes.clear();
 }
 
 void Run(const Catalogue::Function& function, long calls)
 {
-    std::printf("%s\n", function.name.c_str());
+    std::fprintf(output, "%s\n", function.name.c_str());
     SeededSource in(SeedOf(function.name));
     ByteSink out;
     std::uint64_t counted = 0;
@@ -56,13 +63,14 @@ void Run(const Catalogue::Function& function, long calls)
             WriteBlock(out.bytes);
     }
     WriteBlock(out.bytes);
-    std::printf("0\n%lu\n", static_cast<unsigned long>(counted));
+    std::fprintf(output, "0\n%lu\n", static_cast<unsigned long>(counted));
 }
 
 void List(const Catalogue::Function& function)
 {
     const bool isPlatform = function.numberClass == Catalogue::NumberClass::Platform;
-    std::printf("%s\t%s\t%s\n", function.name.c_str(), function.family.c_str(), isPlatform ? "platform" : "arithmetic");
+    std::fprintf(output, "%s\t%s\t%s\n", function.name.c_str(), function.family.c_str(),
+                 isPlatform ? "platform" : "arithmetic");
 }
 
 int Main(const char* task)
@@ -77,7 +85,7 @@ int Main(const char* task)
         else
             Run(function, calls);
     }
-    return std::fflush(stdout) == 0 ? EXIT_SUCCESS : EXIT_FAILURE;
+    return std::fflush(output) == 0 ? EXIT_SUCCESS : EXIT_FAILURE;
 }
 
 } // namespace
