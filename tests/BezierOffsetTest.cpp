@@ -253,6 +253,17 @@ TEST(GetSegmentsToOffset, AnyTurnToTheRightIsLittle)
     EXPECT_EQ(Split(bowl, distance).segments.size(), 2U); // the bowl by 17
 }
 
+TEST(GetSegmentsToOffset, CurveWhoseOnlyCuspsArePassedOverComesThroughUnchanged)
+{
+    Segment shifted = arch;
+    for (point2d& p : shifted.points)
+        p = p + vector2d{0.1, 0.7};
+    ASSERT_NE(Part(shifted, 0.0, 1.0), shifted); // a cut rounds
+    const Stretches s = Split(shifted, -DistanceOfCusps(0.0249));
+    ASSERT_EQ(s.segments.size(), 1U);
+    EXPECT_EQ(s.segments[0], shifted);
+}
+
 TEST(GetSegmentsToOffset, PairOfCuspsIsPassedOverOnlyIfClose)
 {
     EXPECT_EQ(Split(arch, -DistanceOfCusps(0.02499)).segments.size(), 1U); // 0.05 apart, all but
