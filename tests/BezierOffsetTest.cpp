@@ -466,6 +466,37 @@ TEST(FindBezierOffsetCurve, ToleranceEqualToTheErrorFails)
     EXPECT_TRUE(FindBezierOffsetCurve(arch.points, offset.data(), 10.0, Above(error), splitParameter));
 }
 
+void FitSamples(const Segment& curve, const Samples& s, Bezier& fit)
+{
+    const PowerForm f = ToPowerForm(curve.points);
+    double error = 0.0;
+    double splitParameter = 0.0;
+    FindBezierOffsetUsingLeastSquares(f.a, f.b, f.c, f.d, fit.data(), nan, s.points.data(),
+                                      static_cast<unsigned long>(s.points.size()), error, splitParameter);
+}
+
+TEST(FindBezierOffsetCurve, ExtremeWithoutACurvatureIsASample)
+{
+    // Straight, and back again from 7/16.
+    const Segment back = {{{0.0, 0.0}, {-224.0, 0.0}, {-192.0, 0.0}, {96.0, 0.0}}};
+    const PowerForm f = ToPowerForm(back.points);
+    double extremes[11];
+    ASSERT_EQ(CubicBezier::FindCurvatureMinMax(f.a, f.b, f.c, extremes), 1);
+    ASSERT_EQ(extremes[0], 0.4375);
+    double curvature = 0.0;
+    ASSERT_FALSE(CubicBezier::GetCurvatureAt(extremes[0], f.a, f.b, f.c, curvature));
+    Samples s;
+    for (const double t : {0.4375, 0.0, 0.1, 0.2, 0.3, 0.4, 0.5, 0.6, 0.7, 0.8, 0.9, 1.0})
+        s.Add(t, f, 5.0);
+    ASSERT_EQ(s.parameters.size(), 12U);
+    Bezier expected;
+    FitSamples(back, s, expected);
+    Bezier offset;
+    double splitParameter = 0.0;
+    FindBezierOffsetCurve(back.points, offset.data(), 5.0, 1.0, splitParameter);
+    EXPECT_TRUE(SameBits(offset.data(), expected.data(), 4));
+}
+
 TEST(FindBezierOffsetCurve, FlatExtremesAreNoSamples)
 {
     // Its speed is extreme at about 0.44, where it bends with a radius far beyond ten times its size.
