@@ -270,6 +270,17 @@ TEST(GetSegmentsToOffset, AnyTurnToTheRightIsLittle)
     EXPECT_EQ(Split(bowl, distance).segments.size(), 2U); // the bowl by 17
 }
 
+TEST(GetSegmentsToOffset, CurveWhoseOnlyCuspsArePassedOverComesThroughUnchanged)
+{
+    Segment shifted = arch;
+    for (point2d& p : shifted.points)
+        p = p + vector2d{0.1, 0.7};
+    ASSERT_NE(Part(shifted, 0.0, 1.0), shifted); // a cut rounds
+    const Stretches s = Split(shifted, -DistanceOfCusps(0.0249));
+    ASSERT_EQ(s.segments.size(), 1U);
+    EXPECT_EQ(s.segments[0], shifted);
+}
+
 TEST(GetSegmentsToOffset, PairOfCuspsIsPassedOverOnlyIfClose)
 {
     EXPECT_EQ(Split(arch, -DistanceOfCusps(0.02499)).segments.size(), 1U); // 0.05 apart, all but
@@ -470,6 +481,37 @@ TEST(FindBezierOffsetCurve, ToleranceEqualToTheErrorFails)
     EXPECT_LT(error, 1.0);
     EXPECT_FALSE(FindBezierOffsetCurve(arch.points, offset.data(), 10.0, error, splitParameter));
     EXPECT_TRUE(FindBezierOffsetCurve(arch.points, offset.data(), 10.0, Above(error), splitParameter));
+}
+
+void FitSamples(const Segment& curve, const Samples& s, Bezier& fit)
+{
+    const PowerForm f = ToPowerForm(curve.points);
+    double error = 0.0;
+    double splitParameter = 0.0;
+    FindBezierOffsetUsingLeastSquares(f.a, f.b, f.c, f.d, fit.data(), nan, s.points.data(),
+                                      static_cast<unsigned long>(s.points.size()), error, splitParameter);
+}
+
+TEST(FindBezierOffsetCurve, ExtremeWithoutACurvatureIsASample)
+{
+    // Straight, and back again from 7/16.
+    const Segment back = {{{0.0, 0.0}, {-224.0, 0.0}, {-192.0, 0.0}, {96.0, 0.0}}};
+    const PowerForm f = ToPowerForm(back.points);
+    double extremes[11];
+    ASSERT_EQ(CubicBezier::FindCurvatureMinMax(f.a, f.b, f.c, extremes), 1);
+    ASSERT_EQ(extremes[0], 0.4375);
+    double curvature = 0.0;
+    ASSERT_FALSE(CubicBezier::GetCurvatureAt(extremes[0], f.a, f.b, f.c, curvature));
+    Samples s;
+    for (const double t : {0.4375, 0.0, 0.1, 0.2, 0.3, 0.4, 0.5, 0.6, 0.7, 0.8, 0.9, 1.0})
+        s.Add(t, f, 5.0);
+    ASSERT_EQ(s.parameters.size(), 12U);
+    Bezier expected;
+    FitSamples(back, s, expected);
+    Bezier offset;
+    double splitParameter = 0.0;
+    FindBezierOffsetCurve(back.points, offset.data(), 5.0, 1.0, splitParameter);
+    EXPECT_TRUE(SameBits(offset.data(), expected.data(), 4));
 }
 
 TEST(FindBezierOffsetCurve, FlatExtremesAreNoSamples)

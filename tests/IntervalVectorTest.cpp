@@ -168,6 +168,17 @@ TEST(IntervalVector, StorageIsBoundedByTheLength)
     EXPECT_EQ(tight.start, 0U);
 }
 
+TEST(IntervalVector, StorageThatHoldsTheCellsBelowIsEnough)
+{
+    Ints row(0, 1000);
+    row.extend(500, 520);
+    row.clear_section(500, 510); // 10 cells in a capacity of 20
+    row.extend(500, 515);        // 10 below, none above
+    EXPECT_EQ(row.start, 500U);
+    EXPECT_EQ(row.end, 520U);
+    EXPECT_EQ(row.data.capacity(), 20U);
+}
+
 /// The overshoot can pass a capacity that held the request.
 TEST(IntervalVector, OvershootAtTheFrontStaysWithinTheLength)
 {

@@ -269,6 +269,35 @@ TEST(LineProperties, FatlineMeetsWhereTheDistanceIsBelowTheWidth)
     EXPECT_LT(met, 900);
 }
 
+TEST(LineProperties, EachSegmentIsMeasuredFromItsFirstEnd)
+{
+    // The foot of a point differs in its last bits between the two directions. A width in between tells them apart.
+    std::mt19937 engine(5);
+    int toldApart = 0;
+    for (int n = 0; n < 1000; ++n) {
+        const point2d start = RandomPoint(engine);
+        const point2d end = RandomPoint(engine);
+        const vector2d up = Normalize(Perpendicular(end - start));
+        const point2d p = start + (end - start) * 0.4 + up * 0.3;
+        const point2d beyond = p + up * 5.0;
+        const double forward = DistanceToLineSegmentSqrd(start, end, p);
+        const double backward = DistanceToLineSegmentSqrd(end, start, p);
+        const auto [less, more] = std::minmax(forward, backward);
+        double width = std::sqrt(more);
+        while (width * width > more)
+            width = std::nextafter(width, 0.0);
+        if (!(width * width > less) || LengthSquared(end - start) < 4.0)
+            continue;
+        const bool isNear = forward < backward;
+        EXPECT_EQ(Meet({start, end, p, beyond}, width), isNear);
+        EXPECT_EQ(Meet({start, end, beyond, p}, width), isNear);
+        EXPECT_EQ(Meet({p, beyond, start, end}, width), isNear);
+        EXPECT_EQ(Meet({beyond, p, start, end}, width), isNear);
+        ++toldApart;
+    }
+    EXPECT_GT(toldApart, 100);
+}
+
 TEST(LineProperties, ReflectionKeepsDistancesFromTheLineAndUndoesItself)
 {
     std::mt19937 engine(3);

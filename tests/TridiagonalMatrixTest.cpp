@@ -168,6 +168,13 @@ TEST(TridiagonalMatrix, ZeroDivisorsAreNotReported)
     EXPECT_FALSE(std::isfinite(singular.Solve(std::vector<double>{1.0, 2.0}, true)[0]));
 }
 
+TEST(TridiagonalMatrix, OverflowReachesTheFirstUnknownAsAnInfinity)
+{
+    // p1 overflows and q1 is 0, so that row 0 leaves (0 - p1 - p1)/1; p0 takes no part in it.
+    const TridiagonalMatrix matrix = MatrixOf({{1.0, 1.0, 1.0}, {0.0, 0.125, 0.0}});
+    EXPECT_EQ(matrix.Solve(std::vector<double>{0.0, 1e308}, true)[0], -infinity);
+}
+
 TEST(TridiagonalMatrix, DividesAndDoesNotMultiplyByAReciprocal)
 {
     const TridiagonalMatrix matrix = MatrixOf({{0.0, 49.0, 0.0}});

@@ -323,6 +323,16 @@ TEST(ClosestParameter, FallsBackOnTheNearerEnd)
     EXPECT_EQ(FindClosestPointOnBezier(straightIntegers.data(), POINT{150, 100}), 0.5);
 }
 
+TEST(ClosestParameter, ComparesWithTheEndsAndNotWithTheControlPoints)
+{
+    // Straight up with a speed of 1890*(t - 1/3)^2 + 90, past neither control point: P2 alone is nearer than the start.
+    const POINT upward[4] = {{0, 0}, {0, 100}, {0, -10}, {0, 300}};
+    EXPECT_EQ(FindClosestPointOnBezier(upward, POINT{0, -20}), 0.0);
+    // The same downward: P1 alone is nearer than the end.
+    const POINT downward[4] = {{0, 300}, {0, -10}, {0, 100}, {0, 0}};
+    EXPECT_EQ(FindClosestPointOnBezier(downward, POINT{0, -20}), 1.0);
+}
+
 TEST(ClosestParameter, TakesTheEndAmongEquallyNear)
 {
     const IntegerCubic point = {{{5, 7}, {5, 7}, {5, 7}, {5, 7}}};

@@ -298,6 +298,14 @@ TEST(GetTightBounds, StartsFromTheEvaluationAtZero)
     EXPECT_EQ(box.maxY, 2.0);
 }
 
+TEST(GetTightBounds, OfTwoZerosTheFirstStays)
+{
+    // 3*t^2 - 3*t - 0 begins at -0.0, dips below zero and ends at +0.0.
+    const Box box = TightBox({zero, {3.0, 3.0}, {-3.0, -3.0}, {-0.0, -0.0}});
+    EXPECT_TRUE(SameBits(box.maxX, -0.0));
+    EXPECT_TRUE(SameBits(box.maxY, -0.0));
+}
+
 TEST(GetTightBounds, ResultsMayBeTheCoefficients)
 {
     PowerForm f = ToPowerForm(arch.data());

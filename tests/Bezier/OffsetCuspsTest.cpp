@@ -139,6 +139,15 @@ TEST(FindOffsetCusps, WhereTheCurveTurnsBackTheRadiusIsInfiniteAndPositive)
     EXPECT_EQ(Cusps(f, -5.0), Parameters{});
 }
 
+TEST(FindOffsetCusps, RadiusThatUnderflowsIsThatOfALeftTurn)
+{
+    // (1e-110*t, (t - 5/16)^2) all but turns back at 5/16: the cube of its speed is 0 there, its turning 2e-110.
+    const PowerForm f{zero, {0.0, 1.0}, {1e-110, -0.625}, zero};
+    ASSERT_EQ(CuspsOfBothSides(f, 1.0), Parameters{0.3125});
+    EXPECT_EQ(Cusps(f, 1.0), Parameters{0.3125});
+    EXPECT_EQ(Cusps(f, -1.0), Parameters{});
+}
+
 TEST(FindOffsetCusps, NotANumber)
 {
     EXPECT_EQ(Cusps(ToPowerForm(arch.data()), nan), Parameters{});
