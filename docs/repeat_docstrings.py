@@ -2,7 +2,8 @@
 """Prints a header with the docstring of a declaration repeated before the overloads that share it.
 
 In the headers, declarations that stand together without an empty line share the docstring above the first of them.
-Doxygen gives a docstring to the next declaration only, so it reads the headers through this filter.
+Doxygen gives a docstring to the next declaration only, so it reads the headers through this filter. What the compiler makes
+by itself, and nobody says anything about, is left out.
 """
 
 import re
@@ -17,8 +18,9 @@ def repeat(lines):
     reading = False
     inside = False
     for line in lines:
-        if line.startswith("extern template"):
-            line = "\n"  # it declares nothing new
+        is_default = line.rstrip().endswith("= default;") and not reading
+        if is_default or line.startswith("extern template"):
+            line = "\n"  # nothing that a reader would look for
         stripped = line.strip()
         if stripped.startswith("///"):
             if not reading:

@@ -94,6 +94,12 @@ class Overloads(unittest.TestCase):
                          lines[:3] + ["/// Text.\n"] + lines[3:])
 
 
+    def test_leave_out_what_the_compiler_makes(self):
+        self.assertEqual(list(repeat_docstrings.repeat(["A(const A&) = default;\n"])), ["\n"])
+        documented = ["/// Text.\n", "A(A&&) = default;\n"]
+        self.assertEqual(list(repeat_docstrings.repeat(documented)), documented)
+
+
 class Pages(unittest.TestCase):
     page = Path(__file__).resolve().parent / "what-is-lost.md"
 

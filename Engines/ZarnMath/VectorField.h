@@ -47,7 +47,7 @@ struct VectorField
     VectorField(const VectorField&) = default;
     ~VectorField() = default;
 
-    /// A copy of its own, content and bounds. If an exception comes out, the field is as it was.
+    /// A copy of its own of `other`, empty or not. If an exception comes out, the field is as it was.
     VectorField& operator=(const VectorField& other)
     {
         return *this = VectorField(other);
