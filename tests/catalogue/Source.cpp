@@ -90,11 +90,11 @@ MATRIX Source::Matrix()
 
 MATRIX3D Source::Matrix3()
 {
-    MATRIX3D matrix{};
-    for (auto& row : matrix.m)
+    MATRIX3D m{};
+    for (auto& row : m.m)
         for (std::int32_t& element : row)
             element = Integer();
-    return matrix;
+    return m;
 }
 
 Quaternion Source::Quaternion()
