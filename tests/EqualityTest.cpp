@@ -24,11 +24,11 @@ template <typename Case>
 class Equality : public testing::Test
 {};
 
-using Cases = testing::Types<
-    MadeOf<POINT, std::int32_t>, MadeOf<SIZE, std::int32_t>, MadeOf<RECT, std::int32_t>, MadeOf<point2d, double>,
-    MadeOf<vector2d, double>, MadeOf<vector3dT<double>, double>, MadeOf<BoundsT<double>, double>,
-    MadeOf<CubicBezier::bezier2dT<point2d>, double>, MadeOf<MATRIX, double>, MadeOf<AFF_TRANSFORM, double>,
-    MadeOf<Quaternion, double>, MadeOf<POINT3D, std::int32_t>, MadeOf<MATRIX3D, std::int32_t>>;
+using Cases = testing::Types<MadeOf<POINT, std::int32_t>, MadeOf<SIZE, std::int32_t>, MadeOf<RECT, std::int32_t>,
+                             MadeOf<point2d, double>, MadeOf<vector2d, double>, MadeOf<vector3dT<double>, double>,
+                             MadeOf<BoundsT<double>, double>, MadeOf<CubicBezier::bezier2dT<point2d>, double>,
+                             MadeOf<MATRIX, double>, MadeOf<AFF_TRANSFORM, double>, MadeOf<Quaternion, double>,
+                             MadeOf<POINT3D, std::int32_t>, MadeOf<MATRIX3D, std::int32_t>>;
 TYPED_TEST_SUITE(Equality, Cases);
 
 TYPED_TEST(Equality, CountsEveryField)
