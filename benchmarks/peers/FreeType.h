@@ -41,6 +41,7 @@ struct CubicOutline
         outline.tags = tags.data();
         outline.contours = &end;
     }
+
     CubicOutline(const CubicOutline&) = delete;
     CubicOutline& operator=(const CubicOutline&) = delete;
 };

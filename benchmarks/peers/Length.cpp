@@ -41,7 +41,8 @@ void AskForLength(const Corpus& corpus)
             errors.push_back(std::fabs(answer(i) - truths[i]));
         question.Add(library, std::move(setting), answer, Errors(errors));
     };
-    for (const auto& [order, stretches] : {std::pair{4, 1}, {8, 1}, {10, 1}, {16, 1}, {16, 2}, {16, 4}, {16, 8}, {16, 16}}) {
+    for (const auto& [order, stretches] :
+         {std::pair{4, 1}, {8, 1}, {10, 1}, {16, 1}, {16, 2}, {16, 4}, {16, 8}, {16, 16}}) {
         std::string setting = std::to_string(order) + " samples";
         if (stretches > 1)
             setting = std::to_string(stretches) + " stretches of " + setting;
@@ -52,9 +53,7 @@ void AskForLength(const Corpus& corpus)
     const auto geomCurves = ToGeom(corpus.real.curves);
     for (const char* tolerance : {"1", "0.01", "1e-4", "1e-6"}) {
         add("lib2geom", tolerance, [&, e = std::stod(tolerance)](std::size_t i) { return geomCurves[i].length(e); });
-        add("GSL", tolerance, [&, e = std::stod(tolerance)](std::size_t i) {
-            return lengthByGsl(corpus.forms[i], e);
-        });
+        add("GSL", tolerance, [&, e = std::stod(tolerance)](std::size_t i) { return lengthByGsl(corpus.forms[i], e); });
     }
     question.Ask();
 }

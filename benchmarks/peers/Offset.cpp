@@ -47,12 +47,14 @@ public:
         FT_Stroker_Set(stroker, ToFixed(offsetDistance), FT_STROKER_LINECAP_ROUND, FT_STROKER_LINEJOIN_ROUND, 0);
         FT_Outline_New(library, mostPoints, mostContours, &stroke);
     }
+
     ~Stroker()
     {
         FT_Outline_Done(library, &stroke);
         FT_Stroker_Done(stroker);
         FT_Done_FreeType(library);
     }
+
     Stroker(const Stroker&) = delete;
     Stroker& operator=(const Stroker&) = delete;
 
@@ -87,10 +89,12 @@ struct Collector
     {
         return {FromFixed(v->x), FromFixed(v->y)};
     }
+
     static Collector& Of(void* user)
     {
         return *static_cast<Collector*>(user);
     }
+
     void Add(const point2d& first, const point2d& second, const point2d& end)
     {
         pieces.push_back({pen, first, second, end});
@@ -116,7 +120,8 @@ Pieces ToPieces(FT_Outline& outline)
         Collector& collector = Collector::Of(user);
         const point2d control = Collector::Place(middle);
         const point2d end = Collector::Place(to);
-        collector.Add(collector.pen + (control - collector.pen) * (2.0 / 3.0), end + (control - end) * (2.0 / 3.0), end);
+        collector.Add(collector.pen + (control - collector.pen) * (2.0 / 3.0), end + (control - end) * (2.0 / 3.0),
+                      end);
         return 0;
     };
     walk.cubic_to = [](const FT_Vector* first, const FT_Vector* second, const FT_Vector* to, void* user) {

@@ -111,8 +111,9 @@ void AskForPolyline(const Corpus& corpus)
                      }));
         const auto cairo = std::make_shared<Cairo>();
         cairo->SetTolerance(distance);
-        question.Add("cairo", tolerance, [&curves, cairo](std::size_t i) { return cairo->Flatten(curves[i])->num_data; },
-                     Compare(curves, [&](std::size_t i) { return ToPolyline(*cairo->Flatten(curves[i])); }));
+        question.Add(
+            "cairo", tolerance, [&curves, cairo](std::size_t i) { return cairo->Flatten(curves[i])->num_data; },
+            Compare(curves, [&](std::size_t i) { return ToPolyline(*cairo->Flatten(curves[i])); }));
     }
     question.Ask();
 }

@@ -55,10 +55,12 @@ struct Roots
     {
         return values.data();
     }
+
     [[nodiscard]] const double* end() const
     {
         return values.data() + count;
     }
+
     [[nodiscard]] std::size_t size() const
     {
         return static_cast<std::size_t>(count);

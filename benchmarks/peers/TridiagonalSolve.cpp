@@ -65,7 +65,8 @@ void AskForRows(int count)
         matrix.AddRow(rows.below[i], rows.diagonal[i], rows.above[i]);
     Question question("tridiagonal solve, " + std::to_string(count), rows.diagonal.size());
     const auto add = [&](const char* library, auto solve) {
-        question.AddPass(library, "", [solve] { benchmark::DoNotOptimize(solve()); }, Residual(rows, solve()));
+        question.AddPass(
+            library, "", [solve] { benchmark::DoNotOptimize(solve()); }, Residual(rows, solve()));
     };
     add("ZarnMath", [&] { return matrix.Solve(rows.rightSide, false); });
     add("LAPACK", [&] { return SolveByLapack(rows); });
