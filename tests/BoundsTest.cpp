@@ -447,6 +447,44 @@ TEST(BoundsProperties, BoxHoldsEveryPointAndTouchesOneOnEachSide)
     }
 }
 
+/// The box of points whose extremes stand at one index, by merging one point after the other.
+RECT MergedOneByOne(const RECT& start, const std::vector<POINT>& points)
+{
+    RECT rect = start;
+    for (const POINT& p : points)
+        UnionPointWithRect(rect, p);
+    return rect;
+}
+
+TEST(BoundsProperties, ManyPointsAreMergedAsOneByOneWhereverTheExtremesStand)
+{
+    std::mt19937 engine(2);
+    for (int count = 0; count <= 40; ++count) {
+        for (int at = 0; at < count; ++at) {
+            std::vector<POINT> points = RandomPoints(engine, count, 1000);
+            points[static_cast<std::size_t>(at)] = at % 2 == 0 ? POINT{largest, smallest} : POINT{smallest, largest};
+            for (const RECT& start : {empty, RECT{-10, 2000, 3000, -20}}) {
+                RECT rect = start;
+                UnionPointsWithRect(rect, points.data(), count);
+                ASSERT_EQ(rect, MergedOneByOne(start, points)) << count << " points, the extreme at " << at;
+            }
+            ASSERT_EQ(GetPointsBBox(points.data(), count), MergedOneByOne(empty, points));
+        }
+    }
+}
+
+TEST(BoundsProperties, OfTwoZerosTheFirstStays)
+{
+    const point2d zeros[] = {{-0.0, 0.0}, {0.0, -0.0}, {nan, nan}, {-0.0, 0.0}};
+    for (int first = 0; first < 2; ++first) {
+        const BoundsT<double> box = GetPointsBBox(zeros + first, 4 - first);
+        for (const double x : {box.left, box.right})
+            EXPECT_EQ(Bits(x), Bits(zeros[first].x));
+        for (const double y : {box.top, box.bottom})
+            EXPECT_EQ(Bits(y), Bits(zeros[first].y));
+    }
+}
+
 TEST(BoundsProperties, UnionAndIntersectionAgreeWithMembership)
 {
     std::mt19937 engine(2);

@@ -215,6 +215,22 @@ TEST(RemappedPoint, IsTheStretchAppliedToThePoint)
     EXPECT_TRUE(std::isnan(GetRemappedPoint({1.0, 0.5}, {1.0, 1.0, 1.0, 0.0}, to).x));
 }
 
+TEST(TransformedPointsBBox, RoundsTheExtremesAsEveryPointWouldBe)
+{
+    RandomSource random(11);
+    for (int n = 0; n < 300; ++n) {
+        const MATRIX m =
+            RandomMatrix(random, allMatrixClasses[static_cast<std::size_t>(n) % std::size(allMatrixClasses)]);
+        std::vector<POINT> points;
+        RECT expected = GetEmptyRect();
+        for (int i = 0; i < 1 + n % 7; ++i) {
+            points.push_back(random.IntegerPoint(n % 3 == 0 ? largestInt : 50));
+            UnionPointWithRect(expected, m(ToPoint2d(points.back())));
+        }
+        EXPECT_EQ(GetTransformedPointsBBox(points.data(), points.size(), m), expected) << n;
+    }
+}
+
 } // namespace
 
 } // namespace ZarnMath

@@ -1,4 +1,4 @@
-#include "ZarnMath/ValueTypes.h"
+#include "ZarnMath/ValueTypesInternal.h"
 
 #include "tests/Bits.h"
 #include "tests/Random.h"
@@ -7,6 +7,7 @@
 #include <gtest/gtest.h>
 
 #include <cstddef>
+#include <vector>
 
 // The library leaves these names of the global namespace to its callers.
 enum class POINT;
@@ -321,6 +322,24 @@ TEST(RoundToInt, KeepsIntegers)
         const int n = random.Integer(-2147483647 - 1, 2147483647);
         EXPECT_EQ(RoundToInt(n), n);
     }
+}
+
+TEST(OutwardRounding, IsThatOfTheWholeNumberAboveAndBelow)
+{
+    RandomSource random(5);
+    std::vector<double> values = {
+        0.0,           -0.0,          0.5,           -0.5,  1e-300, -1e-300,  2147483646.5, 2147483647.0, 2147483647.5,
+        -2147483647.5, -2147483648.0, -2147483648.5, 1e300, -1e300, infinity, -infinity,    nan};
+    for (int i = 0; i < 1000; ++i)
+        values.push_back(random.Uniform(-1.0, 1.0) * random.Magnitude());
+    for (int i = -20; i <= 20; ++i)
+        for (const double v : {i * 1.0, Below(i * 1.0), -Below(i * 1.0)})
+            values.push_back(v);
+    for (const double v : values) {
+        EXPECT_EQ(CeilToInt(v), RoundToInt(std::ceil(v))) << v;
+        EXPECT_EQ(FloorToInt(v), RoundToInt(std::floor(v))) << v;
+    }
+    EXPECT_EQ(RoundOutward({-1.5, 2.25, 3.0, -4.0}), (RECT{-2, 3, 3, -4}));
 }
 
 TEST(Point2dToPoint, RoundsElementByElementAndNoMore)

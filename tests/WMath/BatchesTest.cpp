@@ -2,7 +2,7 @@
 // in the array.
 #include "tests/WMath/Matrices.h"
 
-#include "ZarnMath/WMathInternal.h"
+#include "ZarnMath/WMath/Batches.h"
 
 #include <functional>
 #include <new>
@@ -194,6 +194,23 @@ TEST(Batches, TranslateOneByOne)
                 const auto wrap = [](std::int64_t v) { return static_cast<std::int32_t>(v); };
                 return POINT{wrap(std::int64_t{offset.x} + p.x), wrap(std::int64_t{offset.y} + p.y)};
             });
+}
+
+/// The loop itself, on the registers that every processor has: what the library runs where there are no wider ones.
+TEST(Batches, NarrowRegistersGiveTheSameBits)
+{
+    RandomSource random(6);
+    for (const MATRIX& m : TrickyMatrices(random)) {
+        ExpectOneByOne<point2d>(
+            RealPoints(random),
+            [&](point2d* p, unsigned long n) {
+                ForEachPointApart(p, n, m, [](const point2d& q, const MATRIX& fixed) { return Image(fixed, q); });
+            },
+            [&](point2d p) {
+                m.TransformPoints(&p, 1);
+                return p;
+            });
+    }
 }
 
 TEST(Batches, NoPointsAtAll)
