@@ -121,6 +121,13 @@ std::vector<Cubic> CircleAsCubics(const point2d& centre, const point2d& right)
     return around;
 }
 
+/// Path data of a circle; of one without extent none.
+std::string CircleData(const point2d& centre, const point2d& right, const Frame& frame)
+{
+    const std::vector<Cubic> around = CircleAsCubics(centre, right);
+    return around.empty() ? "" : ChainData(around, frame) + "Z";
+}
+
 bool Overlap(const Bounds& a, const Bounds& b)
 {
     return a.left <= b.right && b.left <= a.right && a.bottom <= b.top && b.bottom <= a.top;
@@ -319,7 +326,7 @@ void PictureWriter::WriteLayer(const Layer& layer)
             data += DotData(p[0], page_);
             break;
         case Layer::Kind::Circle:
-            data += ChainData(CircleAsCubics(p[0], p[1]), page_) + "Z";
+            data += CircleData(p[0], p[1], page_);
             break;
         }
     }

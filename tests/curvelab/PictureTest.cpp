@@ -118,6 +118,19 @@ TEST(Picture, ShowsFactsAndLegend)
     EXPECT_EQ(Count(svg, ">99<"), 0u);
 }
 
+TEST(Picture, ACircleWithoutExtentIsNotDrawn)
+{
+    // Around a point of the drawing that is asked for its nearest one.
+    const Drawing drawing = Square();
+    for (const double radius : {0.0, 1e-13}) {
+        Picture picture(drawing, "test");
+        picture.AddLayer({colour::green, 1.0, "", 1.0}).AddCircle({30000.0, 0.0}, radius);
+        const std::string svg = picture.Render({});
+        EXPECT_TRUE(IsWellFormed(svg));
+        EXPECT_EQ(Count(svg.substr(svg.find("</style>")), colour::green), 0u);
+    }
+}
+
 TEST(Picture, EveryColourHasOneForTheDark)
 {
     const Drawing drawing = Square();
