@@ -159,6 +159,7 @@ PAGE = """<!DOCTYPE html>
 <meta name="viewport" content="width=device-width, initial-scale=1">
 <title>curvelab</title>
 <style>
+:root {{ color-scheme: light; }}
 body {{ margin: 2rem; background: #eef0f3; color: #1d2530; font: 16px/1.5 Helvetica, Arial, sans-serif; }}
 main {{ display: grid; grid-template-columns: repeat(auto-fit, minmax(26rem, 1fr)); gap: 2rem; align-items: start; }}
 figure {{ margin: 0; padding: 1.25rem; background: #fff; border-radius: 8px; box-shadow: 0 1px 4px #0002; }}

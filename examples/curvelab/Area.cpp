@@ -148,6 +148,7 @@ Command AreaCommand()
             "polygon of 4096 chords to a curve. There is no integer overload: --integer asks about the rounded\n"
             "control points in double.",
             {},
+            {{"area rose-window.svg -o area.svg", "Which way each contour runs, and what it encloses"}},
             Prepare};
 }
 

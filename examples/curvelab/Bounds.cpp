@@ -142,8 +142,11 @@ void Show(const Totals& totals, Picture& picture)
     for (const Bounds& box : totals.curves)
         around += 2.0 * (box.right - box.left + box.top - box.bottom);
     const double dot = picture.DotWidth(totals.curves.size(), 0.5 * around, 8.0);
-    const Style curve{colour::blue, 1.0, "", 0.55};
-    const Style contour{colour::green, 1.75, "", 1.0};
+    // Lines would fill boxes of a few pixels, those of small letters for one.
+    const double side = 0.25 * around * picture.PixelsPerUnit() / static_cast<double>(totals.curves.size());
+    const double line = std::clamp(0.08 * side, 0.4, 1.0);
+    const Style curve{colour::blue, line, "", 0.55};
+    const Style contour{colour::green, 1.75 * line, "", 1.0};
     const Style drawing{colour::ink, 2.5, "9 6", 1.0};
     const Style ofX{colour::orange, dot, "", 1.0};
     const Style ofY{colour::blue, dot, "", 1.0};
@@ -184,6 +187,7 @@ Command BoundsCommand()
             "outside by rounding only. There is no integer overload: --integer asks about the rounded control points\n"
             "in double.",
             {},
+            {{"bounds knots.svg -o boxes.svg", "The tight boxes, and where a coordinate is extreme"}},
             Prepare};
 }
 

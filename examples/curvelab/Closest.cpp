@@ -229,6 +229,10 @@ Command ClosestCommand()
         "is\n"
         "that of a foot; for an end without one it is \"none\". Curves count from 0, in drawing order.",
         {{"--to", "X,Y", "The point, in drawing units; it may lie outside the drawing", ""}},
+        {{"closest nautilus.svg --to 67000,52000 -o nearest.svg",
+          "The point of the drawing that is nearest to one beside it"},
+         {"closest --text \"Ampersand &\" --font DejaVuSans.ttf --to 53000,16500 --json",
+          "The same for letters, as JSON on standard output"}},
         Prepare};
 }
 

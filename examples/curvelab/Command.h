@@ -26,6 +26,13 @@ struct OptionSpec
     std::string fallback; ///< the value when the option is not given; empty if it must be
 };
 
+/// A command line to try, on one of the drawings that come with the program.
+struct Example
+{
+    std::string arguments; ///< behind the program's name
+    std::string shows;
+};
+
 /// The values of a command's own options, by the name with its dashes. Each option of the command is present.
 using Arguments = std::map<std::string, std::string>;
 
@@ -47,6 +54,7 @@ struct Command
     std::string summary; ///< one line
     std::string details; ///< what the help says below the options
     std::vector<OptionSpec> options;
+    std::vector<Example> examples; ///< at least one
     /// Reads the option values, before the drawing is loaded, so that a wrong one is named at once.
     Question (*prepare)(const Arguments& arguments);
 };
@@ -61,6 +69,7 @@ struct Command
 [[nodiscard]] Command IntersectCommand();
 [[nodiscard]] Command LengthCommand();
 [[nodiscard]] Command OffsetCommand();
+[[nodiscard]] Command ReportCommand();
 [[nodiscard]] Command SmoothCommand();
 [[nodiscard]] Command SplitCommand();
 [[nodiscard]] Command TangentsCommand();
@@ -71,7 +80,7 @@ struct Command
 {
     return {FlattenCommand(),   SplitCommand(),     ClosestCommand(),  CurvatureCommand(), LengthCommand(),
             BoundsCommand(),    IntersectCommand(), TangentsCommand(), AreaCommand(),      CuspsCommand(),
-            TransformCommand(), OffsetCommand(),    FitCommand(),      SmoothCommand()};
+            TransformCommand(), OffsetCommand(),    FitCommand(),      SmoothCommand(),    ReportCommand()};
 }
 
 /// Calls f(curve, index) with each curve of a job's drawing in turn, and keeps the progress.

@@ -1,11 +1,13 @@
 #include "CommandLine.h"
 
 #include "Failure.h"
+#include "Help.h"
 #include "Numbers.h"
 
 #include <CLI/CLI.hpp>
 
 #include <algorithm>
+#include <map>
 
 namespace curvelab {
 
@@ -16,11 +18,6 @@ namespace {
 /// sums of two stay within 32 bits.
 constexpr std::int64_t largestUnits = std::int64_t{1} << 28;
 
-constexpr const char* planeNote =
-    "Drawing units: the artwork is turned so that y grows upward, its lower left corner is put at 0,0, and its larger\n"
-    "side is scaled to 100000 units, or as many as --units says. All coordinates and distances are in these units.\n"
-    "Lines, quadratics and arcs become cubics. Errors end with status 2 and one line that says what is wrong.";
-
 /// The texts of one command's options, in the order in which it lists them.
 struct Texts
 {
@@ -29,41 +26,36 @@ struct Texts
     std::string units = "100000";
 };
 
+/// Where the value of a common option goes.
+std::string& TargetOf(const std::string& name, Texts& texts)
+{
+    const std::map<std::string, std::string*> targets{
+        {"--text", &texts.common.text},      {"--font", &texts.common.font}, {"--units", &texts.units},
+        {"--output", &texts.common.picture}, {"--json", &texts.common.json},
+    };
+    return *targets.at(name);
+}
+
 void AddCommonOptions(CLI::App& app, Texts& texts)
 {
-    CommonOptions& common = texts.common;
-    app.add_option("drawing", common.input, "An SVG file, or a list of points named *.txt")
-        ->type_name("FILE")
-        ->group("Drawing");
-    app.add_option("--text", common.text, "Take this text as the drawing instead, set in --font")
-        ->type_name("TEXT")
-        ->group("Drawing");
-    app.add_option("--font", common.font, "The font for --text, any outline font file")
-        ->type_name("FILE")
-        ->group("Drawing");
-    app.add_option("--units", texts.units, "Length of the drawing's larger side, 1 to 268435456 (default 100000)")
-        ->type_name("N")
-        ->group("Drawing");
-    app.add_flag("--integer", common.integer, "Round the control points to whole units and ask the integer overloads")
-        ->group("Drawing");
-    app.add_option("-o,--output", common.picture, "Write the picture, an SVG file")->type_name("FILE")->group("Output");
-    app.add_option("--json", common.json,
-                   "Write the numbers as JSON; - or nothing for standard output. Without it they are summed up there")
-        ->type_name("FILE")
-        ->expected(0, 1)
-        ->default_str("-")
-        ->group("Output");
+    app.add_option("drawing", texts.common.input);
+    for (const CommonOptionSpec& spec : CommonOptionSpecs()) {
+        const std::string names = (spec.shortName.empty() ? "" : spec.shortName + ',') + spec.option.name;
+        if (spec.option.valueName.empty()) {
+            app.add_flag(names, texts.common.integer);
+            continue;
+        }
+        CLI::Option* const option = app.add_option(names, TargetOf(spec.option.name, texts));
+        if (spec.isOptional)
+            option->expected(0, 1)->default_str("-");
+    }
 }
 
 void AddOwnOptions(CLI::App& app, const Command& command, Texts& texts)
 {
     for (const OptionSpec& option : command.options) {
         std::string& value = texts.arguments[option.name] = option.fallback;
-        const std::string help = option.help + (option.fallback.empty() ? "" : " (default " + option.fallback + ")");
-        app.add_option(option.name, value, help)
-            ->type_name(option.valueName)
-            ->required(option.fallback.empty())
-            ->group("Question");
+        app.add_option(option.name, value)->required(option.fallback.empty());
     }
 }
 
@@ -84,7 +76,7 @@ void RequireCommand(int argc, const char* const* argv, const std::vector<Command
     const std::string word = argv[1];
     const bool isCommand =
         std::any_of(commands.begin(), commands.end(), [&](const Command& command) { return command.name == word; });
-    if (!isCommand && word != "--help" && word != "-h")
+    if (!isCommand && word != "--help" && word != "-h" && word != "--version")
         throw Failure("unknown command " + Quoted(word) + advice);
 }
 
@@ -129,28 +121,32 @@ std::optional<Request> ReadCommandLine(int argc, const char* const* argv, std::s
     const std::vector<Command> commands = Commands();
     RequireCommand(argc, argv, commands);
 
-    CLI::App app("Shows what ZarnMath knows about the curves of a drawing.", "curvelab");
-    app.footer(planeNote);
+    CLI::App app;
     app.require_subcommand(1);
+    app.set_version_flag("--version", Version());
     std::vector<Texts> texts(commands.size());
     std::vector<CLI::App*> apps;
     for (std::size_t i = 0; i < commands.size(); ++i) {
-        apps.push_back(app.add_subcommand(commands[i].name, commands[i].summary));
-        apps.back()->footer(commands[i].details + "\n\n" + planeNote);
+        apps.push_back(app.add_subcommand(commands[i].name));
         AddOwnOptions(*apps.back(), commands[i], texts[i]);
         AddCommonOptions(*apps.back(), texts[i]);
     }
+    const auto chosen = [&] {
+        return std::find_if(apps.begin(), apps.end(), [](const CLI::App* sub) { return sub->parsed(); }) - apps.begin();
+    };
     try {
         app.parse(argc, argv);
     } catch (const CLI::CallForHelp&) {
-        help = app.help();
+        const auto index = static_cast<std::size_t>(chosen());
+        help = index < commands.size() ? Help(commands[index]) : Help(commands);
+        return std::nullopt;
+    } catch (const CLI::CallForVersion&) {
+        help = Version();
         return std::nullopt;
     } catch (const CLI::ParseError& error) {
         throw Failure(error.what());
     }
-
-    const auto chosen = std::find_if(apps.begin(), apps.end(), [](const CLI::App* sub) { return sub->parsed(); });
-    const auto index = static_cast<std::size_t>(chosen - apps.begin());
+    const auto index = static_cast<std::size_t>(chosen());
     return Request{commands[index], texts[index].arguments, Checked(texts[index])};
 }
 

@@ -31,7 +31,7 @@ struct Request
 
 /// Reads the command line.
 ///
-/// @return what to do; nothing if the help has been asked for, and is in `help` now
+/// @return what to do; nothing if the help or the version has been asked for, and is in `help` now
 /// @throw Failure if the command line makes no sense
 [[nodiscard]] std::optional<Request> ReadCommandLine(int argc, const char* const* argv, std::string& help);
 

@@ -379,6 +379,8 @@ Command CurvatureCommand()
             {{"--tooth", "PERCENT",
               "Length of a tooth that three quarters of the comb do not exceed, in percent of the larger side, 0 to 50",
               "2.5"}},
+            {{"curvature nautilus.svg -o comb.svg", "How the drawing bends"},
+             {"curvature knots.svg --tooth 5 -o comb.svg", "The same with longer teeth"}},
             Prepare};
 }
 

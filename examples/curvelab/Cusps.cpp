@@ -191,6 +191,7 @@ Command CuspsCommand()
             "itself has a cusp, the library may list one cusp, two or none. There is no integer overload: --integer\n"
             "asks about the rounded control points in double.",
             {{"--distance", "D", "Distance of the offset, in drawing units; at most ten times the larger side", ""}},
+            {{"cusps rose-window.svg --distance=-2500 -o cusps.svg", "Where the offsets to the right turn back"}},
             Prepare};
 }
 

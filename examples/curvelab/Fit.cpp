@@ -378,6 +378,8 @@ Command FitCommand()
              {"--seed", "N", "Another seed moves them otherwise", "1"},
              {"--corner", "DEGREES", "Joints that turn by more are corners", "20"},
              {"--reach", "N", "So many points on either side tell the direction of a cut", "3"}},
+            {{"fit --text \"R&\" --font DejaVuSans.ttf --tolerance 500 --noise 250 --reach 10 -o fitted.svg",
+              "Cubics through points that are moved at random"}},
             Prepare};
 }
 

@@ -239,6 +239,9 @@ Command FlattenCommand()
         "help, at dense samples of each curve against its polyline.",
         {{"--tolerance", "T", "Allowed distance from the chord, in drawing units; 0 spends the whole budget", ""},
          {"--max-lines", "N", "Most segments for one curve, 1 to 2047", "256"}},
+        {{"flatten nautilus.svg --tolerance 150 -o polylines.svg", "Polylines within 150 units of the curves"},
+         {"flatten nautilus.svg --tolerance 2 --units 2000 --integer",
+          "The same on a coarse grid, with vertices in whole units"}},
         Prepare};
 }
 

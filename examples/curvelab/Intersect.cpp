@@ -411,20 +411,22 @@ Question Prepare(const Arguments&)
 
 Command IntersectCommand()
 {
-    return {"intersect",
-            "Finds where the curves of the drawing cross each other and themselves",
-            "Every pair of curves whose boxes overlap is asked, and each curve with itself. The end that two curves\n"
-            "share in a contour is no crossing. The library looks inside the curves, for crossings and not for\n"
-            "touches: an end that lies on another curve is told apart, be it a touch or a place where the contour\n"
-            "crosses. A crossing exactly on a cut of the library's search is lost; curvelab asks the pieces of uneven\n"
-            "cuts as well, and counts what only they show. Of two parabolas, as in fonts with quadratic outlines, the\n"
-            "library lists nothing; one of them is given a hundred millionth of the drawing as cubic term. A loop\n"
-            "that is detected, and too small to be found, is asked for magnified. Where two curves run along each\n"
-            "other there is no crossing. Repeats within 2 units at a joint count once. All lengths inside the library\n"
-            "are absolute: with few --units, curves count as straight lines. With --integer the integer overloads are\n"
-            "asked, except where curvelab asks once more.",
-            {},
-            Prepare};
+    return {
+        "intersect",
+        "Finds where the curves of the drawing cross each other and themselves",
+        "Every pair of curves whose boxes overlap is asked, and each curve with itself. The end that two curves\n"
+        "share in a contour is no crossing. The library looks inside the curves, for crossings and not for\n"
+        "touches: an end that lies on another curve is told apart, be it a touch or a place where the contour\n"
+        "crosses. A crossing exactly on a cut of the library's search is lost; curvelab asks the pieces of uneven\n"
+        "cuts as well, and counts what only they show. Of two parabolas, as in fonts with quadratic outlines, the\n"
+        "library lists nothing; one of them is given a hundred millionth of the drawing as cubic term. A loop\n"
+        "that is detected, and too small to be found, is asked for magnified. Where two curves run along each\n"
+        "other there is no crossing. Repeats within 2 units at a joint count once. All lengths inside the library\n"
+        "are absolute: with few --units, curves count as straight lines. With --integer the integer overloads are\n"
+        "asked, except where curvelab asks once more.",
+        {},
+        {{"intersect knots.svg -o crossings.svg --json crossings.json", "All crossings, as a picture and as numbers"}},
+        Prepare};
 }
 
 } // namespace curvelab

@@ -256,6 +256,7 @@ Command LengthCommand()
             "error, and a sharp turn between its samples shows there. At most 100000 points. There is no integer\n"
             "overload for the parameters: --integer asks about the rounded control points in double.",
             {{"--spacing", "D", "Length from point to point along a contour, in drawing units", ""}},
+            {{"length rose-window.svg --spacing 1000 -o rulers.svg", "Marks at equal lengths along each contour"}},
             Prepare};
 }
 

@@ -251,6 +251,9 @@ Command OffsetCommand()
             {{"--distance", "D", "Distance of the offset, in drawing units; at most ten times the larger side", ""},
              {"--sides", "N", "1 for one side, 2 for the other side as well", "1"},
              {"--tolerance", "E", "How far a cubic may be from the offset, in drawing units", "50"}},
+            {{"offset nautilus.svg --distance=-2500 -o outline.svg", "Cubics beside the drawing"},
+             {"offset --text \"&\" --font DejaVuSans.ttf --distance 2500 --sides 2 -o outline.svg",
+              "The same on both sides of a letter"}},
             Prepare};
 }
 

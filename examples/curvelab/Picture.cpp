@@ -73,9 +73,19 @@ double Picture::PixelsPerUnit() const
     return layout::side / std::max(view_.right - view_.left, view_.top - view_.bottom);
 }
 
+void Picture::ReplaceByPage(std::string page)
+{
+    replacement_ = std::move(page);
+}
+
 std::string Picture::Render(const Report& report) const
 {
-    return PictureWriter(*this).Write(report);
+    return replacement_.empty() ? PictureWriter::OfPage(*this).Write(report) : replacement_;
+}
+
+std::string Picture::RenderFigure(const std::string& id) const
+{
+    return PictureWriter::OfFigure(*this, id).WriteFigure();
 }
 
 } // namespace curvelab

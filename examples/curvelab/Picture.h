@@ -113,8 +113,16 @@ public:
     /// How many pixels a drawing unit is wide.
     [[nodiscard]] double PixelsPerUnit() const;
 
-    /// The whole picture as SVG.
+    /// Puts a page of HTML in the place of the picture, for an answer that takes more than one.
+    void ReplaceByPage(std::string page);
+
+    /// The whole picture as SVG, or the page in its place.
     [[nodiscard]] std::string Render(const Report& report) const;
+
+    /// The artwork, the layers and the legend as SVG that may stand in a page with others.
+    ///
+    /// @param id differs from that of the others
+    [[nodiscard]] std::string RenderFigure(const std::string& id) const;
 
 private:
     friend class PictureWriter;
@@ -132,6 +140,7 @@ private:
     std::deque<Layer> layers_;
     std::vector<LegendLine> legend_;
     std::optional<Lens> lens_;
+    std::string replacement_; ///< empty as a rule
 };
 
 } // namespace curvelab

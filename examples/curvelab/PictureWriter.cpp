@@ -1,12 +1,12 @@
 #include "PictureWriter.h"
 
-#include <libxml/xmlstring.h>
+#include "Markup.h"
+#include "Numbers.h"
 
 #include <algorithm>
 #include <array>
 #include <charconv>
 #include <cmath>
-#include <filesystem>
 #include <initializer_list>
 #include <span>
 #include <system_error>
@@ -20,7 +20,32 @@ constexpr const char* artFill = "#5d6a79";
 constexpr double artFillOpacity = 0.13;
 constexpr const char* artStroke = "#8d97a3";
 constexpr const char* quiet = "#6b7683";
+constexpr const char* rule = "#dfe3e8";
+constexpr const char* lensPaper = "#f6f7f9";
 constexpr const char* fontFamily = "'Helvetica Neue', Helvetica, Arial, 'DejaVu Sans', sans-serif";
+
+/// What a colour becomes for those who read light on dark.
+struct Shade
+{
+    const char* light;
+    const char* dark;
+};
+
+constexpr Shade shades[] = {
+    {colour::ink, "#e8edf3"},   {colour::blue, "#6cb2ff"}, {colour::orange, "#ff9550"}, {colour::green, "#3ecf9a"},
+    {colour::paper, "#14181d"}, {artFill, "#aab4c0"},      {artStroke, "#76818d"},      {quiet, "#98a3b0"},
+    {rule, "#323941"},          {lensPaper, "#1d2228"},
+};
+
+/// The longest of 1, 2 and 5 times a power of ten that is not above a positive limit.
+double RoundBelow(double limit)
+{
+    const double power = std::pow(10.0, std::floor(std::log10(limit)));
+    for (const double factor : {5.0, 2.0})
+        if (factor * power <= limit)
+            return factor * power;
+    return power;
+}
 
 /// A length on the page, to a thousandth of a pixel.
 std::string Pixels(double value)
@@ -46,32 +71,6 @@ std::string PathCommand(char command, std::initializer_list<point2d> points)
         text += Pixels(p.y);
     }
     return text;
-}
-
-/// Text that may stand in XML, whatever bytes a file name holds.
-std::string Escaped(const std::string& text)
-{
-    const bool isUtf8 = xmlCheckUTF8(reinterpret_cast<const unsigned char*>(text.c_str())) != 0;
-    std::string escaped;
-    for (const char c : text) {
-        const auto byte = static_cast<unsigned char>(c);
-        if (c == '&')
-            escaped += "&amp;";
-        else if (c == '<')
-            escaped += "&lt;";
-        else if (c == '"')
-            escaped += "&quot;";
-        else
-            escaped += byte < 0x20 || (byte >= 0x80 && !isUtf8) ? '?' : c;
-    }
-    return escaped;
-}
-
-/// A file's name without its folders; anything else as it is.
-std::string BaseName(const std::string& name)
-{
-    const std::filesystem::path path(name);
-    return path.has_filename() && name.front() != '-' ? path.filename().string() : name;
 }
 
 std::string Attribute(std::string_view name, const std::string& value)
@@ -120,6 +119,13 @@ std::vector<Cubic> CircleAsCubics(const point2d& centre, const point2d& right)
     for (const Cubic& piece : ArcAsCubics(left, {radius, radius, 0.0, false, true, right}))
         around.push_back(piece);
     return around;
+}
+
+/// Path data of a circle; of one without extent none.
+std::string CircleData(const point2d& centre, const point2d& right, const Frame& frame)
+{
+    const std::vector<Cubic> around = CircleAsCubics(centre, right);
+    return around.empty() ? "" : ChainData(around, frame) + "Z";
 }
 
 bool Overlap(const Bounds& a, const Bounds& b)
@@ -174,7 +180,17 @@ double TextWidth(const std::string& text, double size)
 
 } // namespace
 
-PictureWriter::PictureWriter(const Picture& picture) : picture_(picture)
+std::string PictureWriter::DarkColours()
+{
+    std::string rules;
+    for (const Shade& shade : shades)
+        for (const std::string property : {"fill", "stroke"})
+            rules += '[' + property + "=\"" + shade.light + "\"]{" + property + ':' + shade.dark + '}';
+    return "@media (prefers-color-scheme:dark){" + rules + '}';
+}
+
+PictureWriter::PictureWriter(const Picture& picture, const std::string& id, double above)
+    : picture_(picture), id_(id), above_(above)
 {
     const Bounds& view = picture.view_;
     const double scale = picture.PixelsPerUnit();
@@ -182,38 +198,85 @@ PictureWriter::PictureWriter(const Picture& picture) : picture_(picture)
     artHeight_ = (view.top - view.bottom) * scale;
     width_ = std::max(artWidth_, layout::narrowest) + 2.0 * layout::margin;
     const double left = (width_ - artWidth_) / 2.0;
-    const double bottom = layout::margin + layout::titleHeight + artHeight_;
+    const double bottom = above_ + artHeight_;
     page_ = {scale, left - scale * view.left, bottom + scale * view.bottom};
+}
+
+PictureWriter PictureWriter::OfPage(const Picture& picture)
+{
+    return {picture, "", layout::margin + layout::titleHeight};
+}
+
+PictureWriter PictureWriter::OfFigure(const Picture& picture, const std::string& id)
+{
+    return {picture, id + '-', layout::margin};
 }
 
 std::string PictureWriter::Write(const Report& report)
 {
+    out_ += "<style>" + DarkColours() + "</style>\n<rect" + Attribute("width", "100%") + Attribute("height", "100%") +
+            Attribute("fill", colour::paper) + "/>\n";
     WriteTitle();
+    const double top = WriteView(true);
+    double bottom = WriteFacts(report, WriteLegend(top));
+    if (picture_.lens_)
+        bottom = std::max(bottom, WriteLens(*picture_.lens_, top));
+    return Whole(bottom + layout::margin - 12.0);
+}
+
+std::string PictureWriter::WriteFigure()
+{
+    const double top = WriteView(!picture_.legend_.empty());
+    double bottom = WriteLegend(top) - 30.0;
+    if (picture_.lens_)
+        bottom = std::max(bottom, WriteLens(*picture_.lens_, top));
+    return Whole(bottom + 20.0);
+}
+
+std::string PictureWriter::Whole(double height) const
+{
+    return "<svg xmlns=\"http://www.w3.org/2000/svg\" viewBox=\"0 0 " + Pixels(width_) + ' ' + Pixels(height) +
+           "\" font-family=\"" + fontFamily + "\" stroke-linecap=\"round\" stroke-linejoin=\"round\" fill=\"none\">\n" +
+           out_ + "</svg>\n";
+}
+
+/// The artwork with the layers over it, and the scale below them.
+double PictureWriter::WriteView(bool isRuledOff)
+{
     WriteArtwork();
     WriteLayers();
-    double bottom = layout::margin + layout::titleHeight + artHeight_ + layout::panelGap;
-    out_ += "<path d=\"" + PathCommand('M', {{layout::margin, bottom}}) + "H" + Pixels(width_ - layout::margin) +
-            "\" stroke=\"#dfe3e8\"/>\n";
-    const double top = bottom + 30.0;
-    bottom = WriteFacts(report, WriteLegend(top));
-    if (picture_.lens_) {
+    if (picture_.lens_)
         WriteLensMark(*picture_.lens_);
-        bottom = std::max(bottom, WriteLens(*picture_.lens_, top));
-    }
-
-    const std::string size = Pixels(width_) + ' ' + Pixels(bottom + layout::margin - 12.0);
-    return "<svg xmlns=\"http://www.w3.org/2000/svg\" viewBox=\"0 0 " + size + "\" font-family=\"" + fontFamily +
-           "\" stroke-linecap=\"round\" stroke-linejoin=\"round\" fill=\"none\">\n<rect width=\"100%\" height=\"100%\" "
-           "fill=\"" +
-           colour::paper + "\"/>\n" + out_ + "</svg>\n";
+    const double bottom = above_ + artHeight_;
+    WriteScale(bottom + layout::scaleGap);
+    const double line = bottom + layout::panelGap;
+    if (isRuledOff)
+        out_ += "<path d=\"" + PathCommand('M', {{layout::margin, line}}) + "H" + Pixels(width_ - layout::margin) +
+                '"' + Attribute("stroke", rule) + "/>\n";
+    return line + 30.0;
 }
 
 void PictureWriter::WriteTitle()
 {
     const double line = layout::margin + 14.0;
-    WriteText(layout::margin, line, 24.0, R"( font-weight="600" fill="#1d2530")", "curvelab " + picture_.title_);
+    const std::string title = "curvelab " + picture_.title_;
+    const double room = width_ - 2.0 * layout::margin - TextWidth(title, 24.0) - 20.0;
+    WriteText(layout::margin, line, 24.0, R"( font-weight="600" fill="#1d2530")", title);
     WriteText(width_ - layout::margin, line, 15.0, std::string(R"( text-anchor="end" fill=")") + quiet + '"',
-              BaseName(picture_.drawing_.name));
+              Shortened(BaseName(picture_.drawing_.name), static_cast<std::size_t>(room / TextWidth("x", 15.0))));
+}
+
+/// A bar of a round length, and what it stands for.
+void PictureWriter::WriteScale(double y)
+{
+    const double units = RoundBelow(layout::longestScale / page_.scale);
+    const double right = width_ - layout::margin;
+    const double left = right - units * page_.scale;
+    const auto tick = [&](double x) { return PathCommand('M', {{x, y - 5.0}}) + "v10"; };
+    out_ += "<path" + Attribute("stroke", quiet) + Attribute("stroke-width", "1.5") +
+            Attribute("d", PathCommand('M', {{left, y}}) + 'H' + Pixels(right) + tick(left) + tick(right)) + "/>\n";
+    WriteText(left - 12.0, y + 5.0, 13.0, std::string(R"( text-anchor="end" fill=")") + quiet + '"',
+              FormatNumber(units) + (units == 1.0 ? " unit" : " units"));
 }
 
 void PictureWriter::WriteArtwork()
@@ -238,9 +301,10 @@ void PictureWriter::WriteLayers()
 {
     const point2d corner = page_({picture_.view_.left, picture_.view_.top});
     const double room = layout::margin / 2.0;
-    out_ += "<clipPath id=\"page\"><rect" + Attribute("x", Pixels(corner.x - room)) +
+    out_ += "<clipPath id=\"" + id_ + "page\"><rect" + Attribute("x", Pixels(corner.x - room)) +
             Attribute("y", Pixels(corner.y - room)) + Attribute("width", Pixels(artWidth_ + 2.0 * room)) +
-            Attribute("height", Pixels(artHeight_ + 2.0 * room)) + "/></clipPath>\n<g clip-path=\"url(#page)\">\n";
+            Attribute("height", Pixels(artHeight_ + 2.0 * room)) + "/></clipPath>\n<g clip-path=\"url(#" + id_ +
+            "page)\">\n";
     for (const Layer& layer : picture_.layers_)
         WriteLayer(layer);
     out_ += "</g>\n";
@@ -262,7 +326,7 @@ void PictureWriter::WriteLayer(const Layer& layer)
             data += DotData(p[0], page_);
             break;
         case Layer::Kind::Circle:
-            data += ChainData(CircleAsCubics(p[0], p[1]), page_) + "Z";
+            data += CircleData(p[0], p[1], page_);
             break;
         }
     }
@@ -325,8 +389,8 @@ double PictureWriter::WriteLens(const Lens& lens, double top)
     const Frame frame{scale, centre.x - scale * lens.centre.x, centre.y + scale * lens.centre.y};
     const std::string circle =
         "<circle cx=\"" + Pixels(centre.x) + "\" cy=\"" + Pixels(centre.y) + "\" r=\"" + Pixels(radius) + "\"";
-    out_ += "<clipPath id=\"lens\">" + circle + "/></clipPath>\n<g clip-path=\"url(#lens)\">\n" + circle +
-            " fill=\"#f6f7f9\"/>\n";
+    out_ += "<clipPath id=\"" + id_ + "lens\">" + circle + "/></clipPath>\n<g clip-path=\"url(#" + id_ + "lens)\">\n" +
+            circle + Attribute("fill", lensPaper) + "/>\n";
     WriteLensContent(lens, frame);
     out_ += "</g>\n" + circle + " stroke=\"" + colour::ink + "\" stroke-width=\"1.75\"/>\n";
     WriteText(centre.x, centre.y + radius + 24.0, 13.0, std::string(R"( text-anchor="middle" fill=")") + quiet + '"',

@@ -63,7 +63,7 @@ std::string Readable(const Value& value)
                       value);
 }
 
-std::string Summary(const Report& report)
+std::string Summary(const Report& report, const Paint& paint)
 {
     std::size_t width = 0;
     for (const Fact& fact : report.Facts())
@@ -71,7 +71,8 @@ std::string Summary(const Report& report)
     std::string text;
     for (const Fact& fact : report.Facts())
         if (!fact.label.empty())
-            text += fact.label + std::string(width + 2 - fact.label.size(), ' ') + Readable(fact.value) + '\n';
+            text +=
+                paint.Quiet(fact.label) + std::string(width + 2 - fact.label.size(), ' ') + Readable(fact.value) + '\n';
     return text;
 }
 

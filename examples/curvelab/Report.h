@@ -3,6 +3,7 @@
 #pragma once
 
 #include "Cubic.h"
+#include "Terminal.h"
 
 #include <cstdint>
 #include <string>
@@ -52,7 +53,7 @@ private:
 [[nodiscard]] std::string Readable(const Value& value);
 
 /// The facts with labels, one to a line, the values in one column.
-[[nodiscard]] std::string Summary(const Report& report);
+[[nodiscard]] std::string Summary(const Report& report, const Paint& paint);
 
 /// What the report is about; it stands in front of the answer in JSON.
 struct Subject

@@ -248,6 +248,8 @@ Command SmoothCommand()
         "without the library. Coarse whole units make kinks: --units 100 --integer. There is no integer\n"
         "overload: --integer asks about the rounded control points in double.",
         {{"--corner", "DEGREES", "Joints that turn by more are corners", "30"}},
+        {{"smooth rose-window.svg --units 150 --integer -o smooth.svg",
+          "The kinks that a coarse grid makes, taken out"}},
         Prepare};
 }
 

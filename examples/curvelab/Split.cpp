@@ -142,6 +142,7 @@ Command SplitCommand()
         "exactly 0, in double and in whole units. With --integer each control point of the pieces is rounded once,\n"
         "so none lies farther than sqrt(1/2) units from the same cut in double.",
         {{"--at", "T", "Parameter of the cut, 0 to 1", "0.5"}},
+        {{"split rose-window.svg --at 0.4 --json", "Every curve cut at t = 0.4, as JSON on standard output"}},
         Prepare};
 }
 

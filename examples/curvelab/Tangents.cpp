@@ -120,15 +120,17 @@ Question Prepare(const Arguments& arguments)
 
 Command TangentsCommand()
 {
-    return {"tangents",
-            "Draws the tangents of the drawing that run through a point",
-            "Each curve is asked for the parameters, ends included, at which its tangent line runs through the point.\n"
-            "Where the touching place is the joint of two curves, each of them may report it. A straight curve has no\n"
-            "tangent through a point beside it, and every one through a point on its line, which counts as none. How\n"
-            "far a tangent passes by the point is measured without the library. There is no integer overload:\n"
-            "--integer asks about the rounded control points in double.",
-            {{"--to", "X,Y", "The point, in drawing units; it may lie outside the drawing", ""}},
-            Prepare};
+    return {
+        "tangents",
+        "Draws the tangents of the drawing that run through a point",
+        "Each curve is asked for the parameters, ends included, at which its tangent line runs through the point.\n"
+        "Where the touching place is the joint of two curves, each of them may report it. A straight curve has no\n"
+        "tangent through a point beside it, and every one through a point on its line, which counts as none. How\n"
+        "far a tangent passes by the point is measured without the library. There is no integer overload:\n"
+        "--integer asks about the rounded control points in double.",
+        {{"--to", "X,Y", "The point, in drawing units; it may lie outside the drawing", ""}},
+        {{"tangents nautilus.svg --to 90000,-4000 -o tangents.svg", "All tangents through a point below the drawing"}},
+        Prepare};
 }
 
 } // namespace curvelab

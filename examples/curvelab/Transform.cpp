@@ -387,6 +387,9 @@ Command TransformCommand()
         "and no point of the image lies farther than sqrt(1/2) units from the exact one.",
         {{"--by", "STEPS", "The transform, as in \"rotate:30@50000,0 scale:2,1 skew:10,0\"", ""},
          {"--tolerance", "T", "How far off a number may be when the transform is classified", "1e-9"}},
+        {{"transform rose-window.svg --by \"rotate:30@50000,0 scale:2,1 skew:10,0\" -o turned.svg",
+          "Turned about a point, stretched and leant"},
+         {"transform rose-window.svg --by mirror:70@70000,50000", "What a mirror leaves in place"}},
         Prepare};
 }
 

@@ -3,6 +3,7 @@
 #include "Files.h"
 #include "PointsReader.h"
 #include "SvgReader.h"
+#include "Terminal.h"
 #include "TextReader.h"
 
 #include <chrono>
@@ -61,7 +62,7 @@ void Write(const Request& request, const Subject& subject, const Report& report,
     if (common.json == "-")
         std::cout << json;
     else if (common.json.empty())
-        std::cout << Summary(report);
+        std::cout << Summary(report, Paint(TakesColours(STDOUT_FILENO)));
     if (!std::cout.flush())
         throw Failure("standard output cannot be written");
 }
@@ -104,10 +105,11 @@ int Main(int argc, const char* const* argv)
         if (const std::optional<Request> request = ReadCommandLine(argc, argv, help))
             Run(*request);
         else
-            std::cout << help;
+            std::cout << Paint(TakesColours(STDOUT_FILENO)).Help(help);
         return 0;
     } catch (const std::exception& error) {
-        std::cerr << "curvelab: " << OneLine(error.what()) << '\n';
+        const Paint paint(TakesColours(STDERR_FILENO));
+        std::cerr << paint.Alarm("curvelab:") << ' ' << OneLine(error.what()) << '\n';
         return refused;
     }
 }

@@ -41,27 +41,70 @@ std::string WithoutProgress(const std::string& said)
     return std::regex_replace(said, progress, "");
 }
 
+/// All that comes from the other end of a terminal until that is closed; line ends as they were written.
+std::string SentTo(int terminal)
+{
+    std::string sent;
+    char buffer[4096];
+    for (ssize_t count; (count = ::read(terminal, buffer, sizeof buffer)) > 0;)
+        sent.append(buffer, static_cast<std::size_t>(count));
+    ::close(terminal);
+    sent.erase(std::remove(sent.begin(), sent.end(), '\r'), sent.end());
+    return sent;
+}
+
 } // namespace
 
-Outcome RunCurvelab(const std::vector<std::string>& arguments, const fs::path& folder)
+Outcome RunProgram(std::vector<std::string> words, const fs::path& folder)
 {
     const TemporaryFolder outputs;
     const fs::path out = outputs.Path() / "out";
     const fs::path err = outputs.Path() / "err";
-    std::vector<std::string> words{CURVELAB_PROGRAM};
-    words.insert(words.end(), arguments.begin(), arguments.end());
     const std::vector<char*> pointers = Pointers(words);
 
     const pid_t child = ::fork();
     if (child == 0) {
         Redirect(out, err);
         if (::chdir(folder.c_str()) == 0)
-            ::execv(pointers[0], pointers.data());
+            ::execvp(pointers[0], pointers.data());
         ::_exit(127);
     }
     int status = 0;
     ::waitpid(child, &status, 0);
     return {WIFEXITED(status) ? WEXITSTATUS(status) : -1, ContentOf(out), WithoutProgress(ContentOf(err))};
+}
+
+Outcome RunCurvelab(const std::vector<std::string>& arguments, const fs::path& folder)
+{
+    std::vector<std::string> words{CURVELAB_PROGRAM};
+    words.insert(words.end(), arguments.begin(), arguments.end());
+    return RunProgram(std::move(words), folder);
+}
+
+Outcome RunOnTerminal(const std::vector<std::string>& arguments, const fs::path& folder,
+                      std::vector<std::string> environment)
+{
+    std::vector<std::string> words{CURVELAB_PROGRAM};
+    words.insert(words.end(), arguments.begin(), arguments.end());
+    const std::vector<char*> pointers = Pointers(words), values = Pointers(environment);
+    const int terminal = ::posix_openpt(O_RDWR | O_NOCTTY);
+    if (terminal < 0 || ::grantpt(terminal) != 0 || ::unlockpt(terminal) != 0)
+        std::abort();
+    const int inside = ::open(::ptsname(terminal), O_RDWR | O_NOCTTY);
+
+    const pid_t child = ::fork();
+    if (child == 0) {
+        ::dup2(inside, STDOUT_FILENO);
+        ::dup2(inside, STDERR_FILENO);
+        if (::chdir(folder.c_str()) == 0)
+            ::execve(pointers[0], pointers.data(), values.data());
+        ::_exit(127);
+    }
+    ::close(inside);
+    const std::string sent = SentTo(terminal);
+    int status = 0;
+    ::waitpid(child, &status, 0);
+    return {WIFEXITED(status) ? WEXITSTATUS(status) : -1, WithoutProgress(sent), ""};
 }
 
 struct Numbers::Tree

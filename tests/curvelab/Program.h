@@ -18,6 +18,15 @@ struct Outcome
 /// Runs curvelab with these arguments, in the given folder.
 [[nodiscard]] Outcome RunCurvelab(const std::vector<std::string>& arguments, const std::filesystem::path& folder);
 
+/// Runs any program likewise; it is looked for where the shell would.
+[[nodiscard]] Outcome RunProgram(std::vector<std::string> words, const std::filesystem::path& folder);
+
+/// Runs curvelab with both its outputs on a terminal, in an environment with these values ("NAME=VALUE").
+///
+/// @return what the terminal was sent, as `out`
+[[nodiscard]] Outcome RunOnTerminal(const std::vector<std::string>& arguments, const std::filesystem::path& folder,
+                                    std::vector<std::string> environment);
+
 /// The numbers of a run, found by JSON pointers such as "/answer/cuts/0/1". Looking for what is not there, or is of another
 /// kind, fails the test.
 class Numbers
