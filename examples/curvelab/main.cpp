@@ -67,19 +67,25 @@ void Write(const Request& request, const Subject& subject, const Report& report,
         throw Failure("standard output cannot be written");
 }
 
-void Run(const Request& request)
+/// The line that tells the progress is ended before anything else is said.
+void Ask(const Question& ask, bool integer, const Drawing& drawing, Report& report, Picture& picture)
 {
-    const Question ask = request.command.prepare(request.arguments);
-    RequireOtherFile(request.common, "--output", request.common.picture);
-    RequireOtherFile(request.common, "--json", request.common.json);
-
     using Clock = std::chrono::steady_clock;
     Progress progress(std::cerr, ::isatty(STDERR_FILENO) == 1,
                       [] { return std::chrono::duration<double>(Clock::now().time_since_epoch()).count(); });
+    ask({drawing, integer, progress}, report, picture);
+}
+
+void Run(const Request& request)
+{
+    const Question question = request.command.prepare(request.arguments);
+    RequireOtherFile(request.common, "--output", request.common.picture);
+    RequireOtherFile(request.common, "--json", request.common.json);
+
     const Drawing drawing = Load(request.common);
     Report report;
     Picture picture(drawing, request.command.name + (request.common.integer ? " in whole units" : ""));
-    ask({drawing, request.common.integer, progress}, report, picture);
+    Ask(question, request.common.integer, drawing, report, picture);
     Write(request, Describe(request, drawing), report, picture);
 }
 

@@ -21,7 +21,7 @@ import re
 import subprocess
 import sys
 import tempfile
-import time
+import textwrap
 import xml.etree.ElementTree
 
 # What each command is asked, in units of a hundred thousandth of the drawing.
@@ -109,24 +109,22 @@ def is_finite(value):
     return not isinstance(value, float) or math.isfinite(value)
 
 
-Outcome = collections.namedtuple("Outcome", "command path verdict detail numbers seconds")
+Outcome = collections.namedtuple("Outcome", "command path verdict detail numbers")
 
 
 def ask(curvelab, command, path):
     """Runs one command on one file. The verdict is "answered", "refused" or "failed"."""
     with tempfile.TemporaryDirectory(prefix="curvelab-") as folder:
         output = os.path.join(folder, "output")
-        start = time.monotonic()
         try:
             result = subprocess.run([curvelab, command, path, *QUESTIONS[command], "--json=-", "-o", output],
                                     capture_output=True, text=True, timeout=TIME_LIMIT, check=False)
         except subprocess.TimeoutExpired:
-            return Outcome(command, path, "failed", f"took longer than {TIME_LIMIT} s", None, TIME_LIMIT)
-        seconds = time.monotonic() - start
+            return Outcome(command, path, "failed", f"took longer than {TIME_LIMIT} s", None)
         if result.returncode == 2:
-            return Outcome(command, path, "refused", PROGRESS.sub("", result.stderr).strip(), None, seconds)
+            return Outcome(command, path, "refused", PROGRESS.sub("", result.stderr).strip(), None)
         if result.returncode != 0:
-            return Outcome(command, path, "failed", f"status {result.returncode}", None, seconds)
+            return Outcome(command, path, "failed", f"status {result.returncode}", None)
         try:
             numbers = json.loads(result.stdout)
             if command != "report":
@@ -134,11 +132,11 @@ def ask(curvelab, command, path):
             elif os.path.getsize(output) == 0:
                 raise ValueError("the page is empty")
         except (ValueError, OSError, xml.etree.ElementTree.ParseError) as error:
-            return Outcome(command, path, "failed", f"what it wrote cannot be read: {error}", None, seconds)
+            return Outcome(command, path, "failed", f"what it wrote cannot be read: {error}", None)
         infinite = [key for key, value in numbers["answer"].items() if not is_finite(value)]
         if infinite:
-            return Outcome(command, path, "failed", f"not finite: {', '.join(infinite)}", None, seconds)
-        return Outcome(command, path, "answered", "", numbers, seconds)
+            return Outcome(command, path, "failed", f"not finite: {', '.join(infinite)}", None)
+        return Outcome(command, path, "answered", "", numbers)
 
 
 def reason_of(message):
@@ -192,6 +190,11 @@ def packages_of(folders):
     return versions.splitlines()
 
 
+def paragraph(text):
+    """Its lines, and an empty one."""
+    return [*textwrap.wrap(text, 120, break_long_words=False, break_on_hyphens=False), ""]
+
+
 def page_of(folders, files, outcomes):
     """The totals as a page."""
     by_command = collections.defaultdict(list)
@@ -200,39 +203,33 @@ def page_of(folders, files, outcomes):
     drawn = [o.numbers["drawing"] for o in by_command["bounds"] if o.verdict == "answered"]
     size = {key: sum(drawing[key] for drawing in drawn) for key in ("shapes", "contours", "curves")}
     curves = [drawing["curves"] for drawing in drawn]
-    lines = [
-        "# Real drawings",
-        "",
-        f"Every command of `curvelab` on {len(files)} icons that people drew, from {' and '.join(packages_of(folders))}:",
-        f"{len(outcomes):,} runs, none of which crashed. `./dev drawings` repeats that, and fails on a crash, on a picture",
-        "that is no XML, on a number that is not finite, and on a refusal whose reason it does not know. The files are",
-        "different ones, spread evenly over the folders of the themes.",
-        "",
+    lines = ["# Real drawings", ""]
+    lines += paragraph(
+        f"Every command of `curvelab` on {len(files)} icons that people drew, from {' and '.join(packages_of(folders))}: "
+        f"{len(outcomes):,} runs, and no crash. `./dev drawings` repeats that, and fails on a crash, on a picture that is no "
+        "XML, on a number that is not finite, and on a refusal whose reason it does not know. The files are different ones, "
+        "spread evenly over the folders of the themes.")
+    lines += paragraph(
         f"The drawings hold {size['shapes']:,} shapes with {size['contours']:,} contours and {size['curves']:,} cubics, "
-        f"{min(curves):,} to {max(curves):,} to a",
-        "drawing. The larger side of each is 100000 units.",
-        "",
-        "| command | asked with | answered | refused | seconds | found |",
-        "|---|---|---:|---:|---:|---|",
-    ]
+        f"{min(curves):,} to {max(curves):,} to a drawing. The larger side of each is 100000 units.")
+    lines += ["| command | asked with | answered | refused | found |", "|---|---|---:|---:|---|"]
     for command, runs in by_command.items():
         answered = [run for run in runs if run.verdict == "answered"]
         question = " ".join(f'"{word}"' if " " in word else word for word in QUESTIONS[command])
-        seconds = sum(run.seconds for run in runs)
         lines.append(f"| `{command}` | {f'`{question}`' if question else ''} | {len(answered)} | "
-                     f"{len(runs) - len(answered)} | {seconds:.0f} | {found(command, answered)} |")
+                     f"{len(runs) - len(answered)} | {found(command, answered)} |")
+    lines.append("")
     refused = collections.defaultdict(set)
     for outcome in outcomes:
         if outcome.verdict == "refused":
-            refused[reason_of(outcome.detail) or outcome.detail].add(outcome.path)
-    lines += ["", "Seconds are those of all runs of a command together, with the reading of the file, curvelab's own checks and "
-              "the", "picture, in a build for debugging.", ""]
+            refused[reason_of(outcome.detail)].add(outcome.path)
     if refused:
         lines += ["| refused because the file | files |", "|---|---:|"]
         lines += [f"| {reason} | {len(paths)} |" for reason, paths in sorted(refused.items())]
+        lines.append("")
     else:
-        lines += ["No file was refused."]
-    lines += ["", f"Measured with `./dev drawings --write` on {datetime.date.today().isoformat()}: {machine()}.", ""]
+        lines += paragraph("No file was refused.")
+    lines += paragraph(f"Counted by `./dev drawings --write` on {datetime.date.today().isoformat()}: {machine()}.")
     return "\n".join(lines)
 
 
