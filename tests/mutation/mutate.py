@@ -117,12 +117,15 @@ class Bench:
 
     def dependents(self, unit):
         """The library's sources that a file goes into."""
-        path = str(ROOT / "Engines" / unit)
-        if path in self.objects:
-            return [path]
+        path = ROOT / "Engines" / unit
+        if str(path) in self.objects:
+            return [str(path)]
         listing = subprocess.run(["ninja", "-t", "deps"], cwd=BUILD, capture_output=True, text=True, check=True).stdout
-        dependent = {block.split(":")[0] for block in listing.split("\n\n") if f" {path}\n" in block + "\n"}
-        return [file for file, original in self.objects.items() if str(original.relative_to(BUILD)) in dependent]
+        files = {}
+        for block in listing.split("\n\n"):
+            output, _, inputs = block.partition(":")
+            files[str(BUILD / output.strip())] = {(BUILD / name.strip()).resolve() for name in inputs.split("\n")[1:]}
+        return [file for file, original in self.objects.items() if path in files[str(original)]]
 
     def own_program_notices(self, unit, mutated):
         """How the test files of a header, compiled against the changed one, take it."""
