@@ -22,8 +22,8 @@ OURS = "ZarnMath"
 REMARKS = {
     "nearest point": "The ends are compared besides with ours, which finds stationary points. kurbo takes a tolerance, "
                      "and searches a quadratic approximation.",
-    "roots of degree 3": "kurbo solves in closed form, and returns all real roots. GSL does so too at degree 3; from "
-                         "degree 4 on it finds the eigenvalues of the companion matrix.",
+    "roots of degree 3": "kurbo solves in closed form, and returns all real roots. GSL finds the eigenvalues of the "
+                         "companion matrix, at every degree.",
     "crossings of two curves": "Ours takes a curve that is straight within 2 units for its chord, which is its largest "
                                "error; bezier-js reports a crossing many times, and is asked for 60 pairs only.",
     "crossings with a segment": "Ours returns the crossings with the whole line; those on the segment are counted.",
