@@ -294,6 +294,40 @@ TEST(ReparameterizeU, PointCurveMovesNothing)
     EXPECT_EQ(moved.worst_u, sentinel<double>);
 }
 
+TEST(ReparameterizeUProperties, EachPointIsMovedAsIfItWereAlone)
+{
+    RandomSource random(2);
+    int searched = 0;
+    for (std::size_t n = 1; n < 4000; ++n) {
+        const Cubic curve = random.Curve(Shape::Generic, 100.0);
+        PointRun run = NoisyRun(random, curve, n % 13 + 3, 10.0);
+        for (double& u : run.u)
+            if (const double kind = random.Uniform(0.0, 1.0); kind < 0.1)
+                u = nan; // goes to the search for all roots, as one far away does
+            else
+                u = 0.001 + 0.998 * (kind < 0.3 ? kind : u);
+        std::vector<double> alone;
+        double largest = 0.0;
+        double largest_u = sentinel<double>;
+        for (std::size_t i = 0; i < run.u.size(); ++i) {
+            const Moved moved(curve, run.points[i], run.u[i]);
+            alone.push_back(moved.u);
+            searched += std::isnan(run.u[i]) ? 1 : 0;
+            if (moved.error > largest) {
+                largest = moved.error;
+                largest_u = moved.worst_u;
+            }
+        }
+        double worst_u = sentinel<double>;
+        EXPECT_EQ(Reparameterize_u(run.points.data(), curve.data(), run.u.data(), run.Count(), &worst_u, everywhere),
+                  largest);
+        EXPECT_EQ(worst_u, largest_u);
+        for (std::size_t i = 0; i < run.u.size(); ++i)
+            EXPECT_TRUE(SameBits(run.u[i], alone[i])) << n << ", point " << i;
+    }
+    EXPECT_GT(searched, 2000);
+}
+
 TEST(ReparameterizeUProperties, ParametersAreStationaryOrStay)
 {
     RandomSource random(1);

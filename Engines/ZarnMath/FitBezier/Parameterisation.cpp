@@ -1,10 +1,10 @@
+#include "ZarnMath/Bezier/Pair.h"
 #include "ZarnMath/Bezier/Polynomial.h"
 #include "ZarnMath/BezierInternal.h"
 #include "ZarnMath/FitBezierInternal.h"
 #include "ZarnMath/RootFinder.h"
 
 #include <algorithm>
-#include <optional>
 
 namespace ZarnMath {
 
@@ -23,9 +23,15 @@ double Square(double x) noexcept
 }
 
 /// A cubic, with what of the stationarity of the distance does not depend on the point.
-class TrialCurve
+struct TrialCurve
 {
-public:
+    CubicBezier::PowerForm f;
+    double k5;
+    double k4;
+    double k3;
+    double bc;
+    double cc;
+
     explicit TrialCurve(const point2d* bezier) noexcept
         : f(CubicBezier::ToPowerForm(bezier)), k5(3.0 * Dot(f.a, f.a)), k4(5.0 * Dot(f.b, f.a)),
           k3(4.0 * Dot(f.c, f.a) + 2.0 * Dot(f.b, f.b)), bc(Dot(f.b, f.c)), cc(Dot(f.c, f.c))
@@ -45,14 +51,6 @@ public:
 
     /// The largest square by which the curve exceeds a box on one side.
     [[nodiscard]] double OvershootSquared(const BoundsT<double>& box) const noexcept;
-
-private:
-    CubicBezier::PowerForm f;
-    double k5;
-    double k4;
-    double k3;
-    double bc;
-    double cc;
 };
 
 double TrialCurve::OvershootSquared(const BoundsT<double>& box) const noexcept
@@ -74,29 +72,62 @@ double TrialCurve::OvershootSquared(const BoundsT<double>& box) const noexcept
     return largest;
 }
 
-/// The root of the stationarity near `start`, by Newton's method as long as its steps shrink.
-std::optional<double> FindNearRoot(const Polynomial<5>& polynomial, double start) noexcept
+/// The roots of the stationarity of two points near their parameters, by Newton's method as long as its steps shrink.
+///
+/// Each operation of Newton's method waits for the one before, and points do not depend on each other.
+class NearRoots
 {
-    const auto& [k5, k4, k3, k2, k1, k0] = polynomial.c;
-    double t = start;
-    double previous = 1.0;
-    for (int budget = newtonPasses;; --budget) {
-        const double slope = k1 + t * (2.0 * k2 + t * (3.0 * k3 + t * (4.0 * k4 + 5.0 * k5 * t)));
-        if (slope == 0.0)
-            return std::nullopt;
-        const double next = t - (t * (k1 + t * (k2 + t * (k3 + t * (k4 + k5 * t)))) + k0) / slope;
-        const double step = std::fabs(t - next);
-        if (step < newtonTolerance) {
-            if (next <= 1.0 && next >= 0.0 && std::fabs(next - start) < longestTrustedMove)
-                return next;
-            return std::nullopt;
-        }
-        if (budget < 2 || !(step < previous))
-            return std::nullopt;
-        previous = step;
-        t = next;
+public:
+    NearRoots(const TrialCurve& trial, const point2d& p, const point2d& q, double pStart, double qStart) noexcept
+        : curve(trial), start{pStart, qStart}, t(start)
+    {
+        const auto& [a, b, c, d] = curve.f;
+        const Pair x = d.x - Pair{p.x, q.x};
+        const Pair y = d.y - Pair{p.y, q.y};
+        k2 = 3.0 * (curve.bc + (x * a.x + y * a.y));
+        k1 = curve.cc + 2.0 * (x * b.x + y * b.y);
+        k0 = x * c.x + y * c.y;
     }
-}
+
+    /// Those whose search goes on. A NaN is not among them.
+    [[nodiscard]] const PairMask& Open() const noexcept
+    {
+        return isOpen;
+    }
+
+    void Step() noexcept
+    {
+        const auto& [f, k5, k4, k3, bc, cc] = curve;
+        // A slope of 0 makes a step that is infinite or NaN, and does not shrink.
+        const Pair slope = k1 + t * (2.0 * k2 + t * (3.0 * k3 + t * (4.0 * k4 + 5.0 * k5 * t)));
+        const Pair next = t - (t * (k1 + t * (k2 + t * (k3 + t * (k4 + k5 * t)))) + k0) / slope;
+        const Pair step = Absolute(t - next);
+        t = isOpen ? next : t;
+        hasConverged |= isOpen & (step < newtonTolerance);
+        isOpen &= (step >= newtonTolerance) & (step < previous);
+        previous = step;
+    }
+
+    /// @param[out] root where the search of that half has ended
+    /// @return whether it has converged to a place that can be trusted
+    [[nodiscard]] bool HasFound(int half, double& root) const noexcept
+    {
+        root = t[half];
+        return hasConverged[half] != 0 && root <= 1.0 && root >= 0.0 &&
+               std::fabs(root - start[half]) < longestTrustedMove;
+    }
+
+private:
+    const TrialCurve& curve;
+    Pair k2;
+    Pair k1;
+    Pair k0;
+    Pair start;
+    Pair t;
+    Pair previous = Both(1.0);
+    PairMask hasConverged{};
+    PairMask isOpen = ~hasConverged;
+};
 
 /// The largest squared distance, and the parameter that it is found at.
 struct WorstPoint
@@ -116,11 +147,10 @@ struct WorstPoint
 
 /// Moves a parameter to that of the closest stationary point in (0, 1); without any it stays, and the point does not
 /// count.
-void MoveToClosestRoot(const TrialCurve& curve, const Polynomial<5>& stationarity, const point2d& p, double& u,
-                       WorstPoint& worst) noexcept
+void MoveToClosestRoot(const TrialCurve& curve, const point2d& p, double& u, WorstPoint& worst) noexcept
 {
     double roots[6];
-    const int count = RootFinder::FindRoots<5>(stationarity.c, roots, false);
+    const int count = RootFinder::FindRoots<5>(curve.Stationarity(p).c, roots, false);
     if (count == 0)
         return;
     double best = std::numeric_limits<double>::max();
@@ -132,6 +162,29 @@ void MoveToClosestRoot(const TrialCurve& curve, const Polynomial<5>& stationarit
         }
     }
     worst.Report(best, u);
+}
+
+/// Moves the parameters of up to four points, which is as many as Newton's method takes in the time of one.
+void MoveFour(const TrialCurve& curve, const point2d* points, double* u, int count, WorstPoint& worst) noexcept
+{
+    const auto search = [=, &curve](int i) {
+        const int k = std::min(i, count - 1); // the last point stands in for one that is missing
+        const int l = std::min(i + 1, count - 1);
+        return NearRoots(curve, points[k], points[l], u[k], u[l]);
+    };
+    NearRoots pairs[2] = {search(0), search(2)};
+    for (int budget = newtonPasses; budget > 0 && IsAny(pairs[0].Open() | pairs[1].Open()); --budget)
+        for (NearRoots& pair : pairs)
+            pair.Step();
+    for (int i = 0; i < count; ++i) {
+        double root;
+        if (pairs[i / 2].HasFound(i % 2, root)) {
+            u[i] = root;
+            worst.Report(curve.DistanceSquared(root, points[i]), root);
+        } else {
+            MoveToClosestRoot(curve, points[i], u[i], worst);
+        }
+    }
 }
 
 } // namespace
@@ -161,15 +214,8 @@ double Reparameterize_u(const point2d* points, const point2d* bezier, double* u,
     const int first = u[0] == 0.0 ? 1 : 0;
     const int end = u[count - 1] == 1.0 ? count - 1 : count;
     WorstPoint worst{0.0, worst_u};
-    for (int i = first; i < end; ++i) {
-        const Polynomial<5> stationarity = curve.Stationarity(points[i]);
-        if (const auto root = FindNearRoot(stationarity, u[i])) {
-            u[i] = *root;
-            worst.Report(curve.DistanceSquared(*root, points[i]), *root);
-        } else {
-            MoveToClosestRoot(curve, stationarity, points[i], u[i], worst);
-        }
-    }
+    for (int i = first; i < end; i += 4)
+        MoveFour(curve, points + i, u + i, std::min(4, end - i), worst);
     return std::max(worst.error, curve.OvershootSquared(bounds));
 }
 
