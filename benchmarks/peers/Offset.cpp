@@ -57,7 +57,7 @@ Pieces OffsetBothSides(const Cubic& curve, double tolerance)
 /// curve than the distance, so that no stroke can keep it.
 bool IsDisturbed(const Cubic& curve)
 {
-    constexpr int samples = 50;
+    constexpr int samples = 200;
     constexpr double slack = 1e-3;
     const auto f = CubicBezier::ToPowerForm(curve.data());
     for (int i = 0; i <= samples; ++i) {

@@ -32,12 +32,12 @@ class Section:
 
 SECTIONS = [
     Section("Nearest point", "nearest point",
-            remark="The ends are compared besides with ours, which finds stationary points. kurbo takes a tolerance, and "
-                   "searches a quadratic approximation."),
+            remark="The ends are compared besides with ours, which finds stationary points. kurbo takes a tolerance, "
+                   "and searches a quadratic approximation."),
     Section("Roots", r"roots of degree (\d+)", "degree",
-            remark="kurbo solves a cubic in closed form, and returns all real roots. GSL finds the eigenvalues "
-                   "of the companion matrix, at every degree. The plain form is our own algorithm with every sum a loop and "
-                   "each root polished where it is found; it gives the same bits."),
+            remark="kurbo solves a cubic in closed form, and returns all real roots. GSL finds the eigenvalues of "
+                   "the companion matrix, at every degree. The plain form is our own algorithm with every sum a loop "
+                   "and each root polished where it is found; it gives the same bits."),
     Section("One crossing", r"one crossing, degree (\d+)", "degree"),
     Section("Crossings of two curves", "crossings of two curves",
             remark="Ours takes a curve that is straight within 2 units for its chord, which is its largest error; "
@@ -45,25 +45,26 @@ SECTIONS = [
     Section("Crossings with a segment", "crossings with a segment",
             remark="Ours returns the crossings with the whole line; those on the segment are counted."),
     Section("Arc length", "arc length", depends_on_error=True,
-            remark="Ours is given a number of samples, the peers a tolerance. *Halved to* a tolerance is a loop of ten "
-                   "lines around ours, as a caller would write it: a stretch is measured with 16 samples, and so are its "
-                   "halves, and where the two differ by more, each half is halved in its turn. Our samples stand at "
-                   "abscissae of 14 decimal places, which shows below an error of about 1e-11. paper and bezier-js have "
-                   "one setting."),
+            remark="Ours is given a number of samples, the peers a tolerance. *Halved to* a tolerance is a loop of "
+                   "ten lines around ours, as a caller would write it: a stretch is measured with 16 samples, and so "
+                   "are its halves, and where the two differ by more, each half is halved in its turn. Our samples "
+                   "stand at abscissae of 14 decimal places, which shows below an error of about 1e-11. paper and "
+                   "bezier-js have one setting."),
     Section("Tight box", "tight box",
-            remark="FreeType works in whole 64ths of a unit, and takes the first end for inside. bezier-js keeps what it "
-                   "found: a curve is made anew for each box, which is part of its time."),
+            remark="FreeType works in whole 64ths of a unit, and takes the first end for inside. bezier-js keeps "
+                   "what it found: a curve is made anew for each box, which is part of its time."),
     Section("Polyline", "polyline", depends_on_error=True,
             remark="A tolerance means another distance to each library. cairo works in 256ths of a unit."),
     Section("Offset on both sides", "offset on both sides",
             remark="By 10 units. Ours is cut where it folds, and each stretch gets one cubic; *cut to* a tolerance, "
-                   "stretches are halved until the fit says that it is near. FreeType draws round caps besides. Where a "
-                   "side folds, all come nearer to the curve than asked for, which is nearly all of the error."),
+                   "stretches are halved until the fit says that it is near. FreeType draws round caps besides. "
+                   "Where a side folds, all come nearer to the curve than asked for, which is nearly all of the "
+                   "error."),
     Section("Offset, where nothing folds", "offset on both sides, apart from the curve", depends_on_error=True,
             remark="The same for those curves whose offset stays at its distance from all of the curve. Ours takes "
-                   "longer: it solves for the cusps of the offset, a polynomial of degree 12, and fits each cubic in ten "
-                   "passes that project every sample on it, where FreeType places the handles of a short arc by the "
-                   "angles of its control polygon alone. Half of our time at one cubic each is that projection."),
+                   "longer: it solves for the cusps of the offset, a polynomial of degree 12, and fits each cubic in "
+                   "ten passes that project every sample on it, where FreeType places the handles of a short arc by "
+                   "the angles of its control polygon alone. Half of our time at one cubic each is that projection."),
     Section("One cubic to 60 points", "one cubic to 60 points", depends_on_error=True,
             remark="Both start from the chord length. The peer stops by its own rule."),
     Section("A field sampled", r"field sampled (.*), (\d+), (\d+ %)", "where, size, written",
@@ -224,7 +225,8 @@ def targets_table(questions):
             key = (setting or name, measure)
             least[key] = min(ratio, least.get(key, ratio))
         for (name, measure), ratio in least.items():
-            body.append([question + AT[measure], name, f"{asked:g}", f"{ratio:.3g}", "" if ratio >= asked else "**missed**"])
+            verdict = "" if ratio >= asked else "**missed**"
+            body.append([question + AT[measure], name, f"{asked:g}", f"{ratio:.3g}", verdict])
     return table(["question", "peer", "aim", "measured", ""], body)
 
 
@@ -280,25 +282,25 @@ def chain_remark(questions):
         if cycles:
             parts.append(f"{chain(degree)} of {cycles:.0f} cycles at degree {degree}")
     closed = [ratio for library, _, ratio in target_ratios(questions["roots of degree 3"], "kurbo", None)]
-    remark = ("Polynomials whose control polygon changes sign once, so that there is one root and no cut. Each operation "
-              "waits for the one before: of the conversion, a division and for each further coefficient a product, a "
-              "difference and a sum; of the start, a division and three more; and of each step of Newton's method, a "
-              "product and a sum for each degree, a division and a difference.")
+    remark = ("Polynomials whose control polygon changes sign once, so that there is one root and no cut. Each "
+              "operation waits for the one before: of the conversion, a division and for each further coefficient a "
+              "product, a difference and a sum; of the start, a division and three more; and of each step of Newton's "
+              "method, a product and a sum for each degree, a division and a difference.")
     if parts:
         remark += (f" With four steps and the latencies of Zen 3 ({ADD} cycles for a sum or a product, {DIVIDE} for a "
                    f"division), this chain accounts for {' and '.join(parts)}.")
-    remark += (" The same bits take the same chain, whoever writes it, so that the plain form cannot be left far behind "
-               "here, let alone by a factor of two. What ours saves is the branch at the end of each step, which a "
-               "processor guesses wrong about once a call: four steps are taken before one looks, of 3.6 that are needed "
-               "in the mean.")
+    remark += (" The same bits take the same chain, whoever writes it, so that the plain form cannot be left far "
+               "behind here, let alone by a factor of two. What ours saves is the branch at the end of each step, "
+               "which a processor guesses wrong about once a call: four steps are taken before one looks, of 3.6 that "
+               "are needed in the mean.")
     if closed:
         remark += (f" A closed form has no such chain: kurbo's takes {closed[0]:.2f} of our time at degree 3, over all "
                    "polynomials.")
     return remark + "\n"
 
 
-EQUAL_ERROR = ("At equal error, where *time / ours* is that at the error before it; a peer less exact than our coarsest setting "
-               "is compared with that one:\n")
+EQUAL_ERROR = ("At equal error, where *time / ours* is that at the error before it; a peer less exact than our "
+               "coarsest setting is compared with that one:\n")
 
 
 def sections(questions):
@@ -378,9 +380,9 @@ def processor():
     return platform.machine()
 
 
-AIMS = ("How many times our time a peer is to take, and takes. Where time depends on the error, it is compared with ours at "
-        "the peer's own error, and the least of its settings counts; settings finer than all of ours are in the tables "
-        "below.\n")
+AIMS = ("How many times our time a peer is to take, and takes. Where time depends on the error, it is compared with "
+        "ours at the peer's own error, and the least of its settings counts; settings finer than all of ours are in "
+        "the tables below.\n")
 
 BEGIN, END = "<!-- peers: begin -->", "<!-- peers: end -->"
 
@@ -388,8 +390,8 @@ BEGIN, END = "<!-- peers: begin -->", "<!-- peers: end -->"
 def write_page(page, questions):
     pictures = page.parent / "pictures"
     compiler = subprocess.run(["g++", "-dumpfullversion"], capture_output=True, text=True).stdout.strip()
-    parts = [f"Measured on {datetime.date.today()}, {processor()}, GCC {compiler} at -O3, by `./dev bench --peers`. Times "
-             "are those of the thread, and medians over rounds in which the libraries take turns.\n",
+    parts = [f"Measured on {datetime.date.today()}, {processor()}, GCC {compiler} at -O3, by `./dev bench --peers`. "
+             "Times are those of the thread, and medians over rounds in which the libraries take turns.\n",
              "### What we aim at\n", AIMS, targets_table(questions) + "\n",
              "### In pictures\n", "![Time of each peer as a multiple of ours](pictures/peers-ratios.svg)\n"]
     plot_ratios(questions, pictures / "peers-ratios.svg")
