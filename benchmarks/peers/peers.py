@@ -64,7 +64,7 @@ SECTIONS = [
             remark="The same for those curves whose offset stays at its distance from all of the curve. Ours takes "
                    "longer: it solves for the cusps of the offset, a polynomial of degree 12, and fits each cubic in "
                    "ten passes that project every sample on it, where FreeType places the handles of a short arc by "
-                   "the angles of its control polygon alone. Half of our time at one cubic each is that projection."),
+                   "the angles of its control polygon alone. More than half of our time goes there."),
     Section("One cubic to 60 points", "one cubic to 60 points", depends_on_error=True,
             remark="Both start from the chord length. The peer stops by its own rule."),
     Section("A field sampled", r"field sampled (.*), (\d+), (\d+ %)", "where, size, written",
@@ -289,10 +289,9 @@ def chain_remark(questions):
     if parts:
         remark += (f" With four steps and the latencies of Zen 3 ({ADD} cycles for a sum or a product, {DIVIDE} for a "
                    f"division), this chain accounts for {' and '.join(parts)}.")
-    remark += (" The same bits take the same chain, whoever writes it, so that the plain form cannot be left far "
-               "behind here, let alone by a factor of two. What ours saves is the branch at the end of each step, "
-               "which a processor guesses wrong about once a call: four steps are taken before one looks, of 3.6 that "
-               "are needed in the mean.")
+    remark += (" The same bits take the same chain, whoever writes it, so that the plain form cannot be left behind "
+               "here, let alone by a factor of two. Ours takes four steps before it looks, of 3.6 that are needed in "
+               "the mean, which pays where several roots are polished at once.")
     if closed:
         remark += (f" A closed form has no such chain: kurbo's takes {closed[0]:.2f} of our time at degree 3, over all "
                    "polynomials.")
