@@ -4,10 +4,9 @@
 
 #include "ZarnMath/RootFinder.h"
 #include "benchmarks/Measure.h"
-#include "tests/LiteralRootFinder.h"
+#include "benchmarks/RandomPolynomials.h"
 
 #include <array>
-#include <random>
 #include <vector>
 
 #ifdef ZARNMATH_BENCH_LIB2GEOM
@@ -17,40 +16,12 @@
 namespace ZarnMath::Benchmarks {
 namespace {
 
-template <int N>
-using Ordinates = std::array<double, N + 1>;
-
-template <int N>
-std::vector<Ordinates<N>> RandomPolygons()
-{
-    std::mt19937_64 engine(N);
-    std::uniform_real_distribution<double> ordinate(-1.0, 1.0);
-    std::vector<Ordinates<N>> polygons(corpusSize);
-    for (auto& polygon : polygons)
-        for (double& y : polygon)
-            y = ordinate(engine);
-    return polygons;
-}
-
-/// Highest power first, by forward differences.
-template <int N>
-std::array<double, N + 1> ToCoefficients(Ordinates<N> differences)
-{
-    std::array<double, N + 1> c;
-    for (std::size_t i = 0; i <= N; ++i) {
-        c[N - i] = Literal::binomials[N][i] * differences[0];
-        for (std::size_t j = 0; j + i < N; ++j)
-            differences[j] = differences[j + 1] - differences[j];
-    }
-    return c;
-}
-
 template <int N, int (*Find)(const double*, double*, bool)>
 void RunOnCoefficients(benchmark::State& state)
 {
     std::vector<std::array<double, N + 1>> polynomials;
     for (const auto& polygon : RandomPolygons<N>())
-        polynomials.push_back(ToCoefficients<N>(polygon));
+        polynomials.push_back(ToFallingPowers<N>(polygon));
     const auto find = [](const std::array<double, N + 1>& c) {
         double roots[N + 1];
         const int count = Find(c.data(), roots, false);

@@ -1,6 +1,5 @@
 #include "benchmarks/peers/CorpusFiles.h"
 
-#include "benchmarks/peers/RandomPolynomials.h"
 #include "benchmarks/peers/Truth.h"
 
 #include <fstream>
@@ -26,7 +25,7 @@ void Write(const std::filesystem::path& file, const std::vector<Element>& elemen
 template <int N>
 void WritePolynomials(const std::filesystem::path& folder)
 {
-    const auto polygons = RandomPolygons<N>();
+    const auto polygons = Benchmarks::RandomPolygons<N>();
     std::vector<std::array<double, N + 1>> rows;
     for (const std::vector<double>& roots : TrueRoots<N>(polygons)) {
         auto& row = rows.emplace_back();

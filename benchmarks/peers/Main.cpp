@@ -32,6 +32,7 @@ int main(int argc, char** argv)
     AskForPolyline(corpus);
     AskForOffset(corpus);
     AskForFit(corpus);
+    AskForField();
     AskForPointBatches();
     AskForTridiagonalSolve();
 }

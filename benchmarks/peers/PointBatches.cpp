@@ -1,49 +1,46 @@
-// A matrix on an array of points, in place, beside a copy of the same bytes and beside Eigen. The time is that of a point.
+// A matrix on an array of points, in place, beside Eigen, a loop written by hand for this very processor, and a copy of the
+// same bytes. The time is that of a point.
 // Eigen truncates to integers, which is less work than to round and to saturate.
 
-#include "ZarnMath/WMath.h"
+#include "benchmarks/PointBatches.h"
+#include "benchmarks/EigenPoints.h"
+#include "benchmarks/WideKernels.h"
 #include "benchmarks/peers/Questions.h"
-
-#include <Eigen/Geometry>
 
 #include <cstring>
 
 namespace ZarnMath::Peers {
 namespace {
 
-/// A turn about a point, so that coordinates stay where they are however often it is applied.
-MATRIX Matrix()
+using namespace Benchmarks;
+
+#if defined(__x86_64__)
+
+/// The kernel written by hand; its points have to be those of the library, bit for bit.
+template <typename P>
+void AddByHand(Question& question, std::vector<P>& points)
 {
-    return ConstructRotateAroundMatrix(0.3, {512.25, -300.5});
+    if (!HasWideKernels())
+        return;
+    auto byHand = MakePoints<P>(points.size());
+    auto byLibrary = byHand;
+    TransformByHand(TurnMatrix(), byHand.data(), byHand.size());
+    TurnMatrix().TransformPoints(byLibrary.data(), byLibrary.size());
+    const bool isSame = std::memcmp(byHand.data(), byLibrary.data(), byHand.size() * sizeof(P)) == 0;
+    const auto pass = [&points, m = TurnMatrix()] {
+        TransformByHand(m, points.data(), points.size());
+        benchmark::ClobberMemory();
+    };
+    question.AddPass("by hand", "AVX2", pass, {{"same bits", isSame ? 1.0 : 0.0}});
 }
 
-Eigen::Affine2d EigenMatrix()
-{
-    const MATRIX m = Matrix();
-    Eigen::Affine2d affine;
-    affine.matrix() << m.m11, m.m12, m.dx, m.m21, m.m22, m.dy, 0.0, 0.0, 1.0;
-    return affine;
-}
+#else
 
 template <typename P>
-std::vector<P> MakePoints(std::size_t count)
-{
-    using Coordinate = decltype(P::x);
-    std::vector<P> points(count);
-    for (std::size_t i = 0; i < count; ++i)
-        points[i] = {static_cast<Coordinate>(i * 37 % 20011) - 10000, static_cast<Coordinate>(i * 91 % 30011) - 15000};
-    return points;
-}
+void AddByHand(Question& /*question*/, std::vector<P>& /*points*/)
+{}
 
-template <typename P>
-void TransformByEigen(const Eigen::Affine2d& affine, std::vector<P>& points)
-{
-    using Coordinate = decltype(P::x);
-    Eigen::Map<Eigen::Matrix<Coordinate, 2, Eigen::Dynamic>> map(&points[0].x, 2,
-                                                                 static_cast<Eigen::Index>(points.size()));
-    for (Eigen::Index i = 0; i < map.cols(); ++i)
-        map.col(i) = (affine * Eigen::Vector2d(map.col(i).template cast<double>())).template cast<Coordinate>();
-}
+#endif
 
 template <typename P>
 void AskForBatch(const std::string& name, std::size_t count)
@@ -51,14 +48,15 @@ void AskForBatch(const std::string& name, std::size_t count)
     auto points = MakePoints<P>(count);
     std::vector<P> copy(count);
     Question question(name + ", " + std::to_string(count), count);
-    question.AddPass("ZarnMath", "", [&, m = Matrix()] {
+    question.AddPass("ZarnMath", "", [&, m = TurnMatrix()] {
         m.TransformPoints(points.data(), points.size());
         benchmark::ClobberMemory();
     });
-    question.AddPass("Eigen", "", [&, affine = EigenMatrix()] {
-        TransformByEigen(affine, points);
+    question.AddPass("Eigen", "", [&, affine = ToEigen(TurnMatrix())] {
+        TransformByEigen(affine, points.data(), points.size());
         benchmark::ClobberMemory();
     });
+    AddByHand(question, points);
     question.AddPass("memcpy", "", [&] {
         std::memcpy(copy.data(), points.data(), count * sizeof(P));
         benchmark::ClobberMemory();

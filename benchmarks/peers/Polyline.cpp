@@ -101,16 +101,17 @@ void AskForPolyline(const Corpus& corpus)
     const auto& curves = corpus.real.curves;
     Question question("polyline", curves.size());
     Polyline room(maxLines + 1);
-    for (const char* tolerance : {"2", "1", "0.5", "0.2", "0.1", "0.05", "0.02"}) {
-        const double distance = std::stod(tolerance);
-        const auto flatten = [&, square = distance * distance](std::size_t i) {
+    for (const char* tolerance : {"16", "8", "4", "2", "1", "0.5", "0.2", "0.1", "0.05", "0.02"}) {
+        const auto flatten = [&, square = std::pow(std::stod(tolerance), 2)](std::size_t i) {
             return AdaptiveBezierToLines(curves[i].data(), room.data(), square, maxLines);
         };
         question.Add("ZarnMath", tolerance, flatten, Compare(curves, [&](std::size_t i) {
                          return Polyline(room.begin(), room.begin() + flatten(i) + 1);
                      }));
+    }
+    for (const char* tolerance : {"2", "1", "0.5", "0.2", "0.1", "0.05", "0.02"}) {
         const auto cairo = std::make_shared<Cairo>();
-        cairo->SetTolerance(distance);
+        cairo->SetTolerance(std::stod(tolerance));
         question.Add(
             "cairo", tolerance, [&curves, cairo](std::size_t i) { return cairo->Flatten(curves[i])->num_data; },
             Compare(curves, [&](std::size_t i) { return ToPolyline(*cairo->Flatten(curves[i])); }));

@@ -1,5 +1,7 @@
 #include "benchmarks/peers/Question.h"
 
+#include "benchmarks/peers/Cycles.h"
+
 #include <nlohmann/json.hpp>
 
 #include <time.h>
@@ -16,11 +18,12 @@ constexpr int rounds = 11;
 /// Long enough for the clock, short enough for all libraries to see the same weather on a shared machine.
 constexpr double sliceInNanoseconds = 4e6;
 
-double Median(std::vector<double> values)
+template <typename Cost>
+double MedianOf(std::vector<Cost> costs, double Cost::*kind)
 {
-    const auto middle = values.begin() + static_cast<std::ptrdiff_t>(values.size() / 2);
-    std::nth_element(values.begin(), middle, values.end());
-    return *middle;
+    const auto middle = costs.begin() + static_cast<std::ptrdiff_t>(costs.size() / 2);
+    std::ranges::nth_element(costs, middle, {}, kind);
+    return (*middle).*kind;
 }
 
 /// The time that this thread has run, which other programs on the machine do not add to.
@@ -52,29 +55,32 @@ Measures Errors(std::vector<double> errors)
 
 Question::Question(std::string asked, std::size_t elements) : name(std::move(asked)), count(elements) {}
 
-double Question::Time(const Solver& solver) const
+Question::Cost Question::Time(const Solver& solver) const
 {
-    const double start = NanosecondsRun();
+    static const CycleCounter cycles;
+    const Cost start{NanosecondsRun(), cycles.Read()};
     for (int i = 0; i < solver.repetitions; ++i)
         solver.pass();
-    return (NanosecondsRun() - start) / (static_cast<double>(count) * solver.repetitions);
+    const double answers = static_cast<double>(count) * solver.repetitions;
+    return {(NanosecondsRun() - start.nanoseconds) / answers, (cycles.Read() - start.cycles) / answers};
 }
 
 void Question::Ask()
 {
     for (Solver& solver : solvers) {
-        const double pass = Time(solver) * static_cast<double>(count);
+        const double pass = Time(solver).nanoseconds * static_cast<double>(count);
         solver.repetitions = static_cast<int>(std::max(1.0, sliceInNanoseconds / pass));
     }
     for (int round = 0; round < rounds; ++round)
         for (Solver& solver : solvers)
-            solver.nanoseconds.push_back(Time(solver));
+            solver.costs.push_back(Time(solver));
     for (const Solver& solver : solvers) {
         nlohmann::ordered_json line;
         line["question"] = name;
         line["library"] = solver.library;
         line["setting"] = solver.setting;
-        line["nanoseconds"] = Median(solver.nanoseconds);
+        line["nanoseconds"] = MedianOf(solver.costs, &Cost::nanoseconds);
+        line["cycles"] = MedianOf(solver.costs, &Cost::cycles);
         for (const auto& [measure, value] : solver.measures)
             line["measures"][measure] = value;
         std::cout << line << '\n';

@@ -53,10 +53,18 @@ public:
         solvers.push_back({std::move(library), std::move(setting), std::move(pass), std::move(measures), 1, {}});
     }
 
-    /// Times all of them in turn, several rounds over, and prints a line of JSON for each: the median time of an answer.
+    /// Times all of them in turn, several rounds over, and prints a line of JSON for each: the median time of an answer,
+    /// and its cycles.
     void Ask();
 
 private:
+    /// What an answer costs.
+    struct Cost
+    {
+        double nanoseconds;
+        double cycles; ///< 0 where they cannot be counted
+    };
+
     struct Solver
     {
         std::string library;
@@ -64,10 +72,10 @@ private:
         std::function<void()> pass;
         Measures measures;
         int repetitions;
-        std::vector<double> nanoseconds;
+        std::vector<Cost> costs;
     };
 
-    [[nodiscard]] double Time(const Solver& solver) const;
+    [[nodiscard]] Cost Time(const Solver& solver) const;
 
     std::string name;
     std::size_t count;

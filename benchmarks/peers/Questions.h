@@ -16,6 +16,7 @@ void AskForBox(const Benchmarks::Corpus& corpus);
 void AskForPolyline(const Benchmarks::Corpus& corpus);
 void AskForOffset(const Benchmarks::Corpus& corpus);
 void AskForFit(const Benchmarks::Corpus& corpus);
+void AskForField();
 void AskForPointBatches();
 void AskForTridiagonalSolve();
 

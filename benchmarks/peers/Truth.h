@@ -2,7 +2,8 @@
 /// What the right answers are, found slowly and by other means than the library's.
 #pragma once
 
-#include "benchmarks/Corpus.h"
+#include "benchmarks/RandomPolynomials.h"
+#include "tests/census/BruteForce.h"
 
 namespace ZarnMath::Peers {
 
@@ -22,5 +23,25 @@ struct Box
 
 /// The extent of many samples.
 [[nodiscard]] Box TrueBox(const Cubic& curve);
+
+/// The value at t by repeated linear interpolation (de Casteljau), which is as exact as it gets.
+template <int N>
+double ValueAt(Benchmarks::Ordinates<N> y, double t)
+{
+    for (std::size_t n = N; n > 0; --n)
+        for (std::size_t i = 0; i < n; ++i)
+            y[i] += (y[i + 1] - y[i]) * t;
+    return y[0];
+}
+
+/// The roots in (0, 1) of each polynomial, by brute force.
+template <int N>
+std::vector<std::vector<double>> TrueRoots(const std::vector<Benchmarks::Ordinates<N>>& polygons)
+{
+    std::vector<std::vector<double>> roots;
+    for (const auto& polygon : polygons)
+        roots.push_back(Census::FindZeros([&](double t) { return ValueAt<N>(polygon, t); }, 0.0));
+    return roots;
+}
 
 } // namespace ZarnMath::Peers
