@@ -166,13 +166,13 @@ private:
     }
 };
 
-/// p(t) by Horner's rule, from the highest power inward.
-template <int N>
-[[nodiscard]] inline double Value(const double* c, double t) noexcept
+/// p(t) by Horner's rule, from the highest power inward; of one number or of a pair of them.
+template <int N, typename Number>
+[[nodiscard]] inline Number Value(const double* c, Number t) noexcept
 {
-    double value = c[0];
+    Number value = c[1] + t * c[0];
 #pragma GCC unroll 16
-    for (int i = 1; i <= N; ++i)
+    for (int i = 2; i <= N; ++i)
         value = c[i] + t * value;
     return value;
 }

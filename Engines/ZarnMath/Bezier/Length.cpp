@@ -1,3 +1,4 @@
+#include "ZarnMath/Bezier/Pair.h"
 #include "ZarnMath/Bezier/Polynomial.h"
 #include "ZarnMath/Bezier/PowerForm.h"
 #include "ZarnMath/BezierInternal.h"
@@ -23,9 +24,14 @@ public:
           }}
     {}
 
-    [[nodiscard]] double operator()(double t) const noexcept
+    [[nodiscard]] double At(double t) const noexcept
     {
         return std::sqrt(RootFinder::Value<4>(squared.c, t));
+    }
+
+    [[nodiscard]] Pair At(Pair t) const noexcept
+    {
+        return SquareRoots(RootFinder::Value<4>(squared.c, t));
     }
 
 private:
@@ -41,14 +47,19 @@ public:
         GetGaussianQuadratureWeightsAndAbscissae(order, weights, abscissae);
     }
 
-    /// The integral from t0 to t1.
+    /// The integral from t0 to t1. The samples are taken in pairs, and summed in their order.
     [[nodiscard]] double Integrate(const Speed& speed, double t0, double t1) const noexcept
     {
         const double m = (t0 + t1) * 0.5;
         const double h = (t1 - t0) * 0.5;
         double sum = 0.0;
-        for (int i = 0; i < order; ++i)
-            sum = sum + weights[i] * speed(m + h * abscissae[i]);
+        int i = 0;
+        for (; i + 2 <= order; i += 2) {
+            const Pair terms = LoadPair(weights + i) * speed.At(m + h * LoadPair(abscissae + i));
+            sum = sum + terms[0] + terms[1];
+        }
+        if (i < order)
+            sum = sum + weights[i] * speed.At(m + h * abscissae[i]);
         return h * sum;
     }
 

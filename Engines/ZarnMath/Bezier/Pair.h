@@ -8,6 +8,7 @@
 #include "ZarnMath/ValueTypes.h"
 
 #include <bit>
+#include <cmath>
 #include <cstring>
 
 namespace ZarnMath {
@@ -35,10 +36,22 @@ inline void StorePair(vector2d& v, Pair p) noexcept
     std::memcpy(&v, &p, sizeof p);
 }
 
+[[nodiscard]] inline Pair LoadPair(const double* v) noexcept
+{
+    Pair p;
+    std::memcpy(&p, v, sizeof p);
+    return p;
+}
+
 [[nodiscard]] inline Pair Absolute(Pair p) noexcept
 {
     constexpr std::int64_t allButTheSign = std::numeric_limits<std::int64_t>::max();
     return std::bit_cast<Pair>(std::bit_cast<PairMask>(p) & PairMask{allButTheSign, allButTheSign});
+}
+
+[[nodiscard]] inline Pair SquareRoots(Pair p) noexcept
+{
+    return Pair{std::sqrt(p[0]), std::sqrt(p[1])};
 }
 
 [[nodiscard]] inline bool IsAny(PairMask mask) noexcept
