@@ -40,22 +40,23 @@ STEPS = {
 NO_WORK = {"point", "row", "largest", "rms", "bytes"}
 
 
-def run(program, output, arguments):
-    subprocess.run([program, f"--benchmark_out={output}", "--benchmark_out_format=json", *arguments], check=True,
-                   stdout=subprocess.DEVNULL, stderr=subprocess.DEVNULL)
-    text = output.read_text()
-    return json.loads(text)["benchmarks"] if text else []  # nothing where the filter leaves nothing
+def run(program, *arguments):
+    """What Google Benchmark says of a run; the results are missing where a filter leaves nothing."""
+    process = subprocess.run([program, "--benchmark_format=json", *arguments], capture_output=True, text=True)
+    if process.returncode != 0:
+        sys.exit(process.stderr or process.stdout)
+    return json.loads(process.stdout or '{"benchmarks": []}')
 
 
 def measure(build, rounds, arguments):
     """All results of all rounds, each with its family and the time of the reference call."""
-    programs, output, results = build / "benchmarks", build / "bench-part.json", []
+    programs, results = build / "benchmarks", []
     for turn in range(rounds):
         for program in sorted(programs.glob("*Benchmark")):
             family = program.name.removesuffix("Benchmark")
             print(f"round {turn + 1} of {rounds}: {family:20}", end="\r", file=sys.stderr, flush=True)
-            reference, = run(programs / "RootFinderBenchmark", output, [f"--benchmark_filter=^{REFERENCE}$"])
-            for result in run(program, output, ["--benchmark_min_time=0.05", *arguments]):
+            reference, = run(programs / "RootFinderBenchmark", f"--benchmark_filter=^{REFERENCE}$")["benchmarks"]
+            for result in run(program, "--benchmark_min_time=0.02", *arguments)["benchmarks"]:
                 results.append(result | {"family": family, "reference": reference["cpu_time"]})
     return results
 
@@ -73,8 +74,7 @@ def count_steps(build):
                 steps[int(address, 16)] = step
     counts = {}
     # Without arrays that are too long to be counted in a moment.
-    few = ["--benchmark_min_time=0", "--benchmark_filter=-/[0-9]{5,}$"]
-    for result in run(program, build / "bench-steps.json", few):
+    for result in run(program, "--benchmark_min_time=0", "--benchmark_filter=-/[0-9]{5,}$")["benchmarks"]:
         found = counts.setdefault(result["name"], dict.fromkeys(STEPS, 0))
         for name, count in result.items():
             if name.startswith("@") and int(name[1:]) + start in steps:
@@ -126,7 +126,7 @@ def tables(results, steps):
             rows += [[family, f"{name}/{n}", f"{ratio:.3g}", f"{time:.4g}", work]
                      for n, (ratio, time, work) in by_size.items()]
     return (table(["family", "function", f"time / {REFERENCE}", "ns", "work a call"], rows),
-            table(["family", "function", *(f"ns each of {n}" for n in sizes), "exponent", "work at 1000"], growth))
+            table(["family", "function", *(f"ns each of 10^{k}" for k in range(2, 7)), "exponent", "work at 1000"], growth))
 
 
 BEGIN, END = "<!-- bench: begin -->", "<!-- bench: end -->"
@@ -152,6 +152,8 @@ def main():
     if arguments.filter:
         others.append(f"--benchmark_filter={arguments.filter}")
     results = measure(arguments.build, arguments.rounds, others)
+    if not results:
+        sys.exit("no function has such a name")
     steps = count_steps(arguments.build)
     kept = arguments.build / "bench.json"
     kept.write_text(json.dumps({"reference": REFERENCE, "steps": steps, "benchmarks": results}, indent=1))
