@@ -44,21 +44,23 @@ def run(program, *arguments):
     """What Google Benchmark says of a run; the results are missing where a filter leaves nothing."""
     process = subprocess.run([program, "--benchmark_format=json", *arguments], capture_output=True, text=True)
     if process.returncode != 0:
-        sys.exit(process.stderr or process.stdout)
+        sys.exit("\n" + (process.stderr or process.stdout))
     return json.loads(process.stdout or '{"benchmarks": []}')
 
 
 def measure(build, rounds, arguments):
-    """All results of all rounds, each with its family and the time of the reference call."""
+    """All results of all rounds, each with its family and the time of the reference call; and where they were made."""
     programs, results = build / "benchmarks", []
     for turn in range(rounds):
         for program in sorted(programs.glob("*Benchmark")):
             family = program.name.removesuffix("Benchmark")
             print(f"round {turn + 1} of {rounds}: {family:20}", end="\r", file=sys.stderr, flush=True)
-            reference, = run(programs / "RootFinderBenchmark", f"--benchmark_filter=^{REFERENCE}$")["benchmarks"]
+            before = run(programs / "RootFinderBenchmark", f"--benchmark_filter=^{REFERENCE}$")
+            reference = before["benchmarks"][0]["cpu_time"]
             for result in run(program, "--benchmark_min_time=0.02", *arguments)["benchmarks"]:
-                results.append(result | {"family": family, "reference": reference["cpu_time"]})
-    return results
+                results.append(result | {"family": family, "reference": reference})
+    print(file=sys.stderr)
+    return results, before["context"]
 
 
 def count_steps(build):
@@ -143,22 +145,20 @@ def write_page(page, functions, growth):
 def main():
     parser = argparse.ArgumentParser(description=__doc__, formatter_class=argparse.RawDescriptionHelpFormatter)
     parser.add_argument("build", type=pathlib.Path)
-    parser.add_argument("filter", nargs="?")
     parser.add_argument("--rounds", type=int, default=3)
     parser.add_argument("--page", type=pathlib.Path)
     arguments, others = parser.parse_known_args()
-    if arguments.page and (arguments.filter or others):
+    if arguments.page and others:
         parser.error("a page takes all functions")
-    if arguments.filter:
-        others.append(f"--benchmark_filter={arguments.filter}")
-    results = measure(arguments.build, arguments.rounds, others)
+    others = [other if other.startswith("-") else f"--benchmark_filter={other}" for other in others]
+    results, context = measure(arguments.build, arguments.rounds, others)
     if not results:
         sys.exit("no function has such a name")
     steps = count_steps(arguments.build)
     kept = arguments.build / "bench.json"
-    kept.write_text(json.dumps({"reference": REFERENCE, "steps": steps, "benchmarks": results}, indent=1))
+    kept.write_text(json.dumps({"context": context, "steps": steps, "benchmarks": results}, indent=1))
     functions, growth = tables(results, steps)
-    print(functions, growth, sep="\n\n")
+    print(*(shown for shown in (functions, growth) if shown.count("\n") > 1), sep="\n\n")
     if arguments.page:
         write_page(arguments.page, functions, growth)
     print(f"\nthe runs are in {kept}")
