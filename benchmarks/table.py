@@ -3,9 +3,10 @@
 
     table.py BUILD [--rounds N] [--page FILE] [FILTER] [--benchmark_...]
 
-BUILD holds the programs. They take turns, round after round, and medians are compared. Times are ratios to that of a
-reference call, which is measured just before each program, so that what else the machine does falls out of them. A filter
-is a regular expression for the names, and other options are handed on to the programs. The runs stay in BUILD/bench.json.
+BUILD holds the programs. They take turns, round after round, and medians are compared; a page is worth three rounds.
+Times are ratios to that of a reference call, which is measured just before each program, so that what else the machine
+does falls out of them. A filter is a regular expression for the names, and other options are handed on to the programs.
+The runs stay in BUILD/bench.json.
 """
 import argparse
 import datetime
@@ -145,7 +146,7 @@ def write_page(page, functions, growth):
 def main():
     parser = argparse.ArgumentParser(description=__doc__, formatter_class=argparse.RawDescriptionHelpFormatter)
     parser.add_argument("build", type=pathlib.Path)
-    parser.add_argument("--rounds", type=int, default=3)
+    parser.add_argument("--rounds", type=int, default=1)
     parser.add_argument("--page", type=pathlib.Path)
     arguments, others = parser.parse_known_args()
     if arguments.page and others:
