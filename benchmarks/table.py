@@ -26,7 +26,7 @@ REFERENCE = "FindRoots<5>"
 # Which functions of the library are a step of work, by what their names hold; a lambda inside of one is none.
 STEPS = {
     "passes": r"LeastSquaresSingleIteration(_2Cubics)?\(",
-    "near searches": r"FindNearRoot\(",
+    "near steps": r"NearRoots::Step\(",
     "polynomials": r"FindRootsBySubdivision<|FindQuadraticRoots\(",
     "polygon cuts": r"SplitBezierT<\d+>::Split\(",
     "roots polished": r"Search<\d+>::AppendCrossing\(",
@@ -58,7 +58,7 @@ def measure(build, rounds, arguments):
             print(f"round {turn + 1} of {rounds}: {family:20}", end="\r", file=sys.stderr, flush=True)
             before = run(programs / "RootFinderBenchmark", f"--benchmark_filter=^{REFERENCE}$")
             reference = before["benchmarks"][0]["cpu_time"]
-            for result in run(program, "--benchmark_min_time=0.02", *arguments)["benchmarks"]:
+            for result in run(program, "--benchmark_min_time=0.05", *arguments)["benchmarks"]:
                 results.append(result | {"family": family, "reference": reference})
     print(file=sys.stderr)
     return results, before["context"]
@@ -75,6 +75,8 @@ def count_steps(build):
         for step, pattern in STEPS.items():
             if re.search(pattern + r"[^{]*$", name):
                 steps[int(address, 16)] = step
+    if renamed := STEPS.keys() - set(steps.values()):
+        sys.exit(f"no function of the library is a step of these kinds any more: {renamed}")
     counts = {}
     # Without arrays that are too long to be counted in a moment.
     for result in run(program, "--benchmark_min_time=0", "--benchmark_filter=-/[0-9]{5,}$")["benchmarks"]:
@@ -135,9 +137,9 @@ def tables(results, steps):
 BEGIN, END = "<!-- bench: begin -->", "<!-- bench: end -->"
 
 
-def write_page(page, functions, growth):
+def write_page(page, rounds, functions, growth):
     compiler = subprocess.run(["g++", "-dumpfullversion"], capture_output=True, text=True).stdout.strip()
-    head = f"Measured on {datetime.date.today()}, {processor()}, GCC {compiler} at -O3, by `./dev bench`."
+    head = f"Measured on {datetime.date.today()}, {processor()}, GCC {compiler} at -O3, by `./dev bench --rounds {rounds}`."
     text = page.read_text()
     before, after = text[:text.index(BEGIN) + len(BEGIN)], text[text.index(END):]
     page.write_text("\n\n".join([before, head, "### Times and steps", functions, "### Growth", growth, after]))
@@ -161,7 +163,7 @@ def main():
     functions, growth = tables(results, steps)
     print(*(shown for shown in (functions, growth) if shown.count("\n") > 1), sep="\n\n")
     if arguments.page:
-        write_page(arguments.page, functions, growth)
+        write_page(arguments.page, arguments.rounds, functions, growth)
     print(f"\nthe runs are in {kept}")
 
 
