@@ -20,6 +20,17 @@ void IsBezierValidForOffset(State& state)
 
 BENCHMARK(IsBezierValidForOffset);
 
+void IsBezierValidForOffsetOfControlPoints(State& state)
+{
+    const Corpus& corpus = SharedCorpus();
+    const auto test = [](const Cubic& curve, double distance) {
+        return ZarnMath::IsBezierValidForOffset(curve.data(), distance);
+    };
+    MeasureWork(state, "valid", test, corpus.real.curves, corpus.distances);
+}
+
+BENCHMARK(IsBezierValidForOffsetOfControlPoints);
+
 void GetSegmentsToOffset(State& state)
 {
     const Corpus& corpus = SharedCorpus();
