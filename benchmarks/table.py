@@ -34,7 +34,8 @@ STEPS = {
     "plain Newton searches": r"FindSolutionNewtonsMethod",
     "curve cuts": r"::CutBy<.*",
     "curve points": r"CubicBezier::Evaluate\(\w+::vector2dT",
-    "speed samples": r"::Speed::operator\(\)",
+    "pairs of speed samples": r"::Speed::At\(double __vector",
+    "speed samples": r"::Speed::At\(double\)",
 }
 
 # Numbers that a benchmark reports beside its time, and that are no work: times, errors, memory.
