@@ -64,18 +64,25 @@ void ExpectVertical(const Box& box, double expectedTop, double expectedBottom)
 
 TEST(Layout, FieldsStandInOrder)
 {
-    EXPECT_EQ(sizeof(LayoutMeasure), 16U);
+    struct KindAndValue
+    {
+        std::int32_t kind;
+        double value;
+    };
+
+    constexpr std::size_t measure = sizeof(KindAndValue); // 16, or 12 where a double may stand at any multiple of 4
+    EXPECT_EQ(sizeof(LayoutMeasure), measure);
     EXPECT_LT(offsetof(LayoutMeasure, kind), offsetof(LayoutMeasure, value));
     EXPECT_EQ(offsetof(Layout, width), 0U);
-    EXPECT_EQ(offsetof(Layout, height), 16U);
-    EXPECT_EQ(offsetof(Layout, minWidth), 32U);
-    EXPECT_EQ(offsetof(Layout, minHeight), 48U);
-    EXPECT_EQ(offsetof(Layout, leftMargin), 64U);
-    EXPECT_EQ(offsetof(Layout, rightMargin), 80U);
-    EXPECT_EQ(offsetof(Layout, topMargin), 96U);
-    EXPECT_EQ(offsetof(Layout, bottomMargin), 112U);
-    EXPECT_EQ(offsetof(Layout, verticalAlign), 128U);
-    EXPECT_EQ(offsetof(Layout, horizontalAlign), 132U);
+    EXPECT_EQ(offsetof(Layout, height), measure);
+    EXPECT_EQ(offsetof(Layout, minWidth), 2 * measure);
+    EXPECT_EQ(offsetof(Layout, minHeight), 3 * measure);
+    EXPECT_EQ(offsetof(Layout, leftMargin), 4 * measure);
+    EXPECT_EQ(offsetof(Layout, rightMargin), 5 * measure);
+    EXPECT_EQ(offsetof(Layout, topMargin), 6 * measure);
+    EXPECT_EQ(offsetof(Layout, bottomMargin), 7 * measure);
+    EXPECT_EQ(offsetof(Layout, verticalAlign), 8 * measure);
+    EXPECT_EQ(offsetof(Layout, horizontalAlign), 8 * measure + 4U);
     EXPECT_EQ(static_cast<int>(LayoutUnit::None), 0);
     EXPECT_EQ(static_cast<int>(LayoutUnit::Absolute), 1);
     EXPECT_EQ(static_cast<int>(LayoutUnit::Relative), 2);

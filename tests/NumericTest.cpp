@@ -240,7 +240,9 @@ TEST(LinearBlend, OfNoStepsIsOne)
 TEST(LinearBlend, ConvertsBeforeItDivides)
 {
     constexpr unsigned long most = std::numeric_limits<unsigned long>::max();
-    EXPECT_EQ(GetLinearBlendFactor(most - 1, most), 1.0); // both round to the same
+    if (sizeof most == 8) {
+        EXPECT_EQ(GetLinearBlendFactor(most - 1, most), 1.0); // both round to the same
+    }
     EXPECT_EQ(GetLinearBlendFactor(most, 1), static_cast<double>(most));
 }
 

@@ -71,6 +71,8 @@ std::optional<std::string> RunCase(const Case& recorded, const Adapter& adapter,
     try {
         adapter(in, out);
         in.ExpectEnd();
+    } catch (const TooWide&) {
+        throw;
     } catch (const std::exception& trouble) {
         return trouble.what();
     }

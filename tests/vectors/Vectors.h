@@ -52,6 +52,13 @@ public:
     using std::runtime_error::runtime_error;
 };
 
+/// An integer that a `long` of this machine does not hold. It was recorded where one has 64 bits.
+class TooWide : public Malformed
+{
+public:
+    using Malformed::Malformed;
+};
+
 /// One value of a line: `d` and 16 hexadecimal digits, `f` and 8, `i` and a decimal integer, or `nan`.
 /// @throws Malformed
 Value ParseValue(std::string_view token);
@@ -157,8 +164,12 @@ void Read(Input& in, T& v)
     } else {
         const Value& value = in.Next();
         v = static_cast<T>(value.bits);
-        if (value.kind != Value::Kind::Integer || ToValue(v).bits != value.bits)
-            throw Malformed("no integer of this width: " + Describe(value));
+        const bool isInteger = value.kind == Value::Kind::Integer;
+        if (isInteger && ToValue(v).bits == value.bits)
+            return;
+        if (isInteger && sizeof(T) < sizeof value.bits && std::is_same_v<std::make_signed_t<T>, long>)
+            throw TooWide("no long of this machine: " + Describe(value));
+        throw Malformed("no integer of this width: " + Describe(value));
     }
 }
 

@@ -7,7 +7,6 @@
 
 #include "ZarnMath/ValueTypes.h"
 
-#include <bit>
 #include <cmath>
 #include <cstring>
 
@@ -46,7 +45,7 @@ inline void StorePair(vector2d& v, Pair p) noexcept
 [[nodiscard]] inline Pair Absolute(Pair p) noexcept
 {
     constexpr std::int64_t allButTheSign = std::numeric_limits<std::int64_t>::max();
-    return std::bit_cast<Pair>(std::bit_cast<PairMask>(p) & PairMask{allButTheSign, allButTheSign});
+    return reinterpret_cast<Pair>(reinterpret_cast<PairMask>(p) & PairMask{allButTheSign, allButTheSign});
 }
 
 [[nodiscard]] inline Pair SquareRoots(Pair p) noexcept
