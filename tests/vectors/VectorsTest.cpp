@@ -53,6 +53,7 @@ struct Tally
 {
     int casesRun = 0;
     int casesWithinUnits = 0;
+    int casesTooWide = 0;
     std::map<std::string, int> withoutAdapter;
 
     [[nodiscard]] int CasesWithoutAdapter() const
@@ -67,6 +68,7 @@ struct Tally
     {
         casesRun += other.casesRun;
         casesWithinUnits += other.casesWithinUnits;
+        casesTooWide += other.casesTooWide;
         for (const auto& [name, number] : other.withoutAdapter)
             withoutAdapter[name] += number;
     }
@@ -77,6 +79,8 @@ std::ostream& operator<<(std::ostream& out, const Tally& tally)
     out << tally.casesRun << " cases ran";
     if (tally.casesWithinUnits > 0)
         out << " (" << tally.casesWithinUnits << " of them compared within units in the last place)";
+    if (tally.casesTooWide > 0)
+        out << ", " << tally.casesTooWide << " hold an integer that no long takes here";
     out << ", " << tally.CasesWithoutAdapter() << " without an adapter";
     const char* separator = ": ";
     for (const auto& [name, number] : tally.withoutAdapter) {
@@ -128,15 +132,16 @@ TEST_P(VectorFile, GivesWhatWasRecorded)
             continue;
         }
         const Comparison comparison = ComparisonFor(*entry, *differing, DoesZeroSignCount(GetParam()));
-        ++tally.casesRun;
-        tally.casesWithinUnits += comparison.units > 0 ? 1 : 0;
         try {
             const auto mismatch = RunCase(recorded, entry->adapter, comparison);
             if (mismatch && ++failures[recorded.name] <= mostMessagesPerFunction)
                 ADD_FAILURE_AT(PathOf(GetParam()).c_str(), recorded.line) << recorded.name << ": " << *mismatch;
         } catch (const TooWide&) {
-            --tally.casesRun;
+            ++tally.casesTooWide;
+            continue;
         }
+        ++tally.casesRun;
+        tally.casesWithinUnits += comparison.units > 0 ? 1 : 0;
     }
     for (const auto& [name, number] : failures)
         ADD_FAILURE() << number << " cases of " << name << " failed";
