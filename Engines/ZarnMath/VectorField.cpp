@@ -4,6 +4,7 @@
 #include "ZarnMath/ValueTypesInternal.h"
 
 #include <algorithm>
+#include <cstring>
 #include <utility>
 
 namespace ZarnMath {
@@ -25,12 +26,20 @@ RECT BoundsFrom(int x, int y, int width, int height) noexcept
     return {x, WrappingSubtract(WrappingAdd(y, height), 1), WrappingSubtract(WrappingAdd(x, width), 1), y};
 }
 
-/// Into [0, limit]; NaN, which is not below 0 and not within the limit, becomes the limit.
-float Clamp(float v, float limit) noexcept
+/// Both coordinates of a position: one instruction works on the two side by side, each with its own rounding.
+using FloatPair = float __attribute__((vector_size(8)));
+
+FloatPair LoadPair(const vector2dT<float, true>& v) noexcept
 {
-    if (v < 0.0F)
-        return 0.0F;
-    return v <= limit ? v : limit;
+    FloatPair p;
+    std::memcpy(&p, &v, sizeof p);
+    return p;
+}
+
+/// Into [0, limit]; NaN, which is not below 0 and not within the limit, becomes the limit.
+FloatPair Clamp(FloatPair v, FloatPair limit) noexcept
+{
+    return v < FloatPair{} ? FloatPair{} : (v <= limit ? v : limit);
 }
 
 Vector Interpolate(const Vector& a, const Vector& b, float t) noexcept
@@ -161,17 +170,18 @@ VectorField VectorField::GetRegion(const RECT& rect)
 
 Vector VectorField::Get(vector2dT<float, true> position) const noexcept
 {
-    const float fx = Clamp(position.x - static_cast<float>(originX), static_cast<float>(width) - 2.0F);
-    const float fy = Clamp(position.y - static_cast<float>(originY), static_cast<float>(height) - 2.0F);
+    const FloatPair origin{static_cast<float>(originX), static_cast<float>(originY)};
+    const FloatPair size{static_cast<float>(width), static_cast<float>(height)};
+    const FloatPair f = Clamp(LoadPair(position) - origin, size - 2.0F);
     // A size above 2^24 can round upward as a float. 64 bits hold any column then, and the last row stands in for those
     // beyond it.
-    const auto ix = static_cast<std::int64_t>(fx);
-    const auto iy = static_cast<std::int64_t>(fy);
+    const auto ix = static_cast<std::int64_t>(f[0]);
+    const auto iy = static_cast<std::int64_t>(f[1]);
+    const float tx = f[0] - static_cast<float>(ix);
+    const float ty = f[1] - static_cast<float>(iy);
     const std::int64_t last = std::int64_t{height} - 1;
     const Row* lower = rows.data() + std::min(iy, last);
     const Row* upper = lower + (iy < last ? 1 : 0);
-    const float tx = fx - static_cast<float>(ix);
-    const float ty = fy - static_cast<float>(iy);
     return Interpolate(InterpolateColumns(*lower, ix, tx), InterpolateColumns(*upper, ix, tx), ty);
 }
 
