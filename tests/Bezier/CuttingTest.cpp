@@ -152,22 +152,28 @@ TEST(Split, ExtrapolatesOutsideTheUnitInterval)
     EXPECT_EQ(right[3], (point2d{3, 6}));
 }
 
+/// Both forms of the cut, and nothing beyond their arrays.
+template <typename P>
+void ExpectPieces(double t, const std::array<P, 4>& curve, const std::array<P, 7>& expected)
+{
+    Guarded<P, 4> left;
+    Guarded<P, 4> right;
+    Guarded<P, 7> seven;
+    Split(t, curve.data(), left.data(), right.data());
+    Split(t, curve.data(), seven.data());
+    EXPECT_TRUE(SameBits(left.data(), expected.data(), 4));
+    EXPECT_TRUE(SameBits(right.data(), expected.data() + 3, 4));
+    EXPECT_TRUE(SameBits(seven.data(), expected.data(), 7));
+    EXPECT_TRUE(left.IsIntact() && right.IsIntact() && seven.IsIntact());
+}
+
 TEST(Split, FollowsDeCasteljauToTheBit)
 {
     RandomSource random(13);
     for (int i = 0; i < 3000; ++i) {
         const Cubic curve = random.Curve();
         const double t = random.Uniform(-1.0, 2.0);
-        const auto expected = CutAt(t, curve.data());
-        Guarded<point2d, 4> left;
-        Guarded<point2d, 4> right;
-        Guarded<point2d, 7> seven;
-        Split(t, curve.data(), left.data(), right.data());
-        Split(t, curve.data(), seven.data());
-        EXPECT_TRUE(SameBits(left.data(), expected.data(), 4));
-        EXPECT_TRUE(SameBits(right.data(), expected.data() + 3, 4));
-        EXPECT_TRUE(SameBits(seven.data(), expected.data(), 7));
-        EXPECT_TRUE(left.IsIntact() && right.IsIntact() && seven.IsIntact());
+        ExpectPieces(t, curve, CutAt(t, curve.data()));
     }
 }
 
@@ -197,16 +203,7 @@ TEST(Split, OfIntegersRoundsOnceAtTheEnd)
     for (int i = 0; i < 3000; ++i) {
         const IntegerCubic curve = random.IntegerCurve(i % 2 == 0 ? 20 : 1000000000);
         const double t = random.Uniform(0.0, 1.0);
-        const auto expected = Rounded(CutAt(t, ToDouble(curve).data()));
-        Guarded<POINT, 4> left;
-        Guarded<POINT, 4> right;
-        Guarded<POINT, 7> seven;
-        Split(t, curve.data(), left.data(), right.data());
-        Split(t, curve.data(), seven.data());
-        EXPECT_TRUE(SameBits(left.data(), expected.data(), 4));
-        EXPECT_TRUE(SameBits(right.data(), expected.data() + 3, 4));
-        EXPECT_TRUE(SameBits(seven.data(), expected.data(), 7));
-        EXPECT_TRUE(left.IsIntact() && right.IsIntact() && seven.IsIntact());
+        ExpectPieces(t, curve, Rounded(CutAt(t, ToDouble(curve).data())));
     }
 }
 
