@@ -177,6 +177,7 @@ void AskForRoots()
     AskForRootsOfDegrees(std::make_integer_sequence<int, 10>());
     AskForRootOfOneCrossing<3>();
     AskForRootOfOneCrossing<5>();
+    AskForRootOfOneCrossing<9>();
 }
 
 } // namespace ZarnMath::Peers
