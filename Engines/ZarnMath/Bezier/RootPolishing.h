@@ -147,14 +147,20 @@ void PolishTogether(const double* c, const Crossing* crossings, int count, doubl
     }
 }
 
-/// Polishes all crossings, four at a time; the roots go to their places.
+/// Polishes all crossings, four at a time; the roots go to their places. Alone and of a high degree, a root is left to the
+/// plain method: a step too many would take longer than the branch.
 template <int N>
 void Polish(const double* c, const Crossing* crossings, int count, double* roots) noexcept
 {
+    constexpr int highestBlindDegree = 5;
     for (; count > 2; crossings += 4, count -= 4)
         PolishTogether<N, 2>(c, crossings, std::min(count, 4), roots);
-    if (count > 0)
+    if (N > highestBlindDegree && count == 1) {
+        const auto& [start, lower, upper, place] = crossings[0];
+        roots[place] = FindSolutionNewtonsMethod_Guaranteed<N>(c, start, lower, upper, rootTolerance);
+    } else if (count > 0) {
         PolishTogether<N, 1>(c, crossings, count, roots);
+    }
 }
 
 } // namespace ZarnMath::RootFinder
