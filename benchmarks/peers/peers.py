@@ -277,7 +277,7 @@ def chain(degree, steps=4):
 def chain_remark(questions):
     """What bounds a call, where cycles could be counted."""
     parts = []
-    for degree in (3, 5, 9):
+    for degree in (3, 5):
         cycles = questions[f"one crossing, degree {degree}"][0].get("cycles")
         if cycles:
             parts.append(f"{chain(degree)} of {cycles:.0f} cycles at degree {degree}")
@@ -288,11 +288,11 @@ def chain_remark(questions):
               "method, a product and a sum for each degree, a division and a difference.")
     if parts:
         remark += (f" With four steps and the latencies of Zen 3 ({ADD} cycles for a sum or a product, {DIVIDE} for a "
-                   f"division), this chain accounts for {', '.join(parts)}.")
+                   f"division), this chain accounts for {' and '.join(parts)}.")
     remark += (" The same bits take the same chain, whoever writes it, so that the plain form cannot be left behind "
-               "here, let alone by a factor of two. Ours takes four steps before it looks, of 3.6 that are needed in "
-               "the mean, which pays where several roots are polished at once and costs where there is one: the "
-               "plain form is ahead at the higher degrees.")
+               "here, let alone by a factor of two. Up to degree 5 ours takes four steps before it looks, of 3.6 that are "
+               "needed in the mean, which pays where several roots are polished at once; a single root of a higher "
+               "degree is left to the plain method.")
     if closed:
         remark += (f" A closed form has no such chain: kurbo's takes {closed[0]:.2f} of our time at degree 3, over all "
                    "polynomials.")
