@@ -107,6 +107,20 @@ TARGETS = [
     ("integer points through a matrix, 4096", "by hand", None, 0.8),
 ]
 
+# What time cannot fall below, or what was written for the one case alone: no peers.
+BOUNDS = ["dense grid", "memcpy", "by hand"]
+
+# By question and library.
+WHY_AHEAD = {
+    ("roots of degree 3", "kurbo"): "A closed form has no steps that wait for each other.",
+    ("crossings with a segment", "kurbo"):
+        "The same closed form; its largest error is ten orders of magnitude above ours.",
+    ("offset on both sides", "FreeType"): "It places handles by angles, where ours fits.",
+    ("offset on both sides, apart from the curve", "FreeType"): "It places handles by angles, where ours fits.",
+    ("integer points through a matrix, 4096", "Eigen"): "It truncates, where ours rounds and saturates.",
+    ("integer points through a matrix, 4000000", "Eigen"): "It truncates, where ours rounds and saturates.",
+}
+
 # What an answer costs; only our own program counts cycles.
 COSTS = ["nanoseconds", "cycles"]
 
@@ -217,17 +231,31 @@ def table(header, rows):
     return "\n".join([line(header), rule, *map(line, rows)])
 
 
+def least_ratios(rows, library, setting):
+    """The least ratio of each peer, or of the setting, by its name and what it was measured for."""
+    least = {}
+    for name, measure, ratio in target_ratios(rows, library, setting):
+        key = (setting or name, measure)
+        least[key] = min(ratio, least.get(key, ratio))
+    return least
+
+
 def targets_table(questions):
     body = []
     for question, library, setting, asked in TARGETS:
-        least = {}
-        for name, measure, ratio in target_ratios(questions.get(question, []), library, setting):
-            key = (setting or name, measure)
-            least[key] = min(ratio, least.get(key, ratio))
-        for (name, measure), ratio in least.items():
+        for (name, measure), ratio in least_ratios(questions.get(question, []), library, setting).items():
             verdict = "" if ratio >= asked else "**missed**"
             body.append([question + AT[measure], name, f"{asked:g}", f"{ratio:.3g}", verdict])
     return table(["question", "peer", "aim", "measured", ""], body)
+
+
+def ahead_table(questions):
+    body = []
+    for question, rows in questions.items():
+        for (name, measure), ratio in least_ratios(rows, EVERY_PEER, None).items():
+            if ratio < 1 and name not in BOUNDS:
+                body.append([question + AT[measure], name, f"{ratio:.3g}", WHY_AHEAD.get((question, name), "")])
+    return table(["question", "peer", "time / ours", ""], body)
 
 
 def section_table(section, questions):
@@ -386,6 +414,8 @@ AIMS = ("How many times our time a peer is to take, and takes. Where time depend
         "ours at the peer's own error, and the least of its settings counts; settings finer than all of ours are in "
         "the tables below.\n")
 
+AHEAD = "All such places, by the fastest setting of each peer:\n"
+
 BEGIN, END = "<!-- peers: begin -->", "<!-- peers: end -->"
 
 
@@ -395,6 +425,7 @@ def write_page(page, questions):
     parts = [f"Measured on {datetime.date.today()}, {processor()}, GCC {compiler} at -O3, by `./dev bench --peers`. "
              "Times are those of the thread, and medians over rounds in which the libraries take turns.\n",
              "### What we aim at\n", AIMS, targets_table(questions) + "\n",
+             "### Where a peer is ahead\n", AHEAD, ahead_table(questions) + "\n",
              "### In pictures\n", "![Time of each peer as a multiple of ours](pictures/peers-ratios.svg)\n"]
     plot_ratios(questions, pictures / "peers-ratios.svg")
     for question, rows in questions.items():
